@@ -1,0 +1,13 @@
+# Everything the product is built from, found in one place.
+find_package(Qt6 6.4 REQUIRED COMPONENTS Core Gui Qml Quick QuickTemplates2 DBus WaylandClient LinguistTools)
+if(FAVRIN_BUILD_TESTS)
+    find_package(Qt6 6.4 REQUIRED COMPONENTS Test)
+endif()
+find_package(PkgConfig REQUIRED)
+find_package(nlohmann_json 3.11 REQUIRED)
+find_package(SQLite3 REQUIRED)
+pkg_check_modules(WaylandServer REQUIRED IMPORTED_TARGET wayland-server)
+pkg_check_modules(WaylandClient REQUIRED IMPORTED_TARGET wayland-client)
+pkg_check_modules(Xkbcommon REQUIRED IMPORTED_TARGET xkbcommon)
+pkg_get_variable(FAVRIN_WAYLAND_PROTOCOLS_DIR wayland-protocols pkgdatadir)
+pkg_get_variable(FAVRIN_WAYLAND_SCANNER wayland-scanner wayland_scanner)

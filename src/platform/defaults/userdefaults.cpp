@@ -1,0 +1,1 @@
+#include "platform/defaults/userdefaults.h"
