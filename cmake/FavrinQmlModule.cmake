@@ -23,6 +23,10 @@ function(favrin_qml_module target)
         QML_FILES ${arg_QML_FILES}
         RESOURCES ${arg_RESOURCES}
     )
+    # Our warnings are for our own code.
+    get_target_property(sources ${target} SOURCES)
+    list(FILTER sources INCLUDE REGEX "/qmlcache/.*\\.cpp$|_qmltyperegistrations\\.cpp$")
+    set_source_files_properties(${sources} PROPERTIES COMPILE_OPTIONS "-w")
     target_link_libraries(${target} PUBLIC favrin_build_options Qt6::Qml Qt6::Quick)
     # The generated type registration includes the headers of the types by file name alone.
     target_include_directories(${target} PRIVATE "${CMAKE_CURRENT_SOURCE_DIR}")
