@@ -1,10 +1,12 @@
 #pragma once
 
+#include <cstddef>
 #include <functional>
-#include <list>
 #include <memory>
 #include <optional>
+#include <type_traits>
 #include <utility>
+#include <vector>
 
 namespace favrin::platform {
 
@@ -44,7 +46,8 @@ private:
 
 /**
  * A stream of values. Delivery is synchronous, on the thread and within the call that sends the value. A publisher is a
- * recipe: nothing happens before sink(). It must not outlive the subject or property it comes from.
+ * recipe: nothing happens before sink(). It may outlive the subject or property it comes from; sink() then delivers
+ * nothing and returns an empty handle. Confined to the thread of its source.
  */
 template<class Value>
 class Publisher
@@ -66,15 +69,16 @@ public:
         });
     }
 
-    /** Drops a value that equals the one before it. */
+    /** Drops a value that equals the one before it; each subscription remembers its own. */
     Publisher removeDuplicates() const
     {
         return Publisher([source = *this](Receive receive) {
             auto last = std::make_shared<std::optional<Value>>();
             return source.sink([last, receive = std::move(receive)](const Value &value) {
-                if (*last == value)
+                // Not "*last == value": when values are optionals themselves, a first "none" would look like no value.
+                if (last->has_value() && **last == value)
                     return;
-                *last = value;
+                last->emplace(value);
                 receive(value);
             });
         });
@@ -84,17 +88,26 @@ private:
     std::function<Subscription(Receive)> m_subscribe;
 };
 
-/** A stream that is fed by hand. Sends to the subscribers there are at that moment, in the order they subscribed. */
+/**
+ * A stream that is fed by hand. Sends to its subscribers in the order they subscribed. One that subscribes during a
+ * delivery hears that value in its turn; one that is cancelled before its turn does not. A subscriber may send another
+ * value (it is delivered to all before the outer delivery goes on) or destroy the subject (the rest hear nothing).
+ */
 template<class Value>
 class Subject
 {
 public:
     Subject() = default;
+    ~Subject() { end(); }
     Subject(const Subject &) = delete;
     Subject &operator=(const Subject &) = delete;
 
     void send(const Value &value);
-    Publisher<Value> publisher();
+    Publisher<Value> publisher() const;
+
+    /** Nothing is delivered from now on, not even the rest of a delivery in progress. */
+    void end();
+    bool hasEnded() const;
 
 private:
     struct Subscribers;
