@@ -1,0 +1,177 @@
+#include "remote/client/remoteviewconnection.h"
+
+#include "favrin-remote-view-v1-client-protocol.h"
+#include "remote/client/remoteviewevents.h"
+#include "remote/wirecolor.h"
+
+#include <cstring>
+
+namespace favrin::remote::client {
+
+namespace {
+
+/** A borrowed view of numbers as the wire's array type. */
+wl_array wireArray(std::vector<double> &values)
+{
+    return {.size = values.size() * sizeof(double), .alloc = 0, .data = values.data()};
+}
+
+const char *wireText(const std::optional<std::string> &text)
+{
+    return text ? text->c_str() : nullptr;
+}
+
+} // namespace
+
+struct RemoteViewConnection::Private : RemoteViewEventsReceiver
+{
+    Private(wl_display *wlDisplay, RemoteViewConnectionDelegate &connectionDelegate)
+        : display(wlDisplay), delegate(connectionDelegate), events(*this)
+    {
+    }
+
+    wl_display *display;
+    RemoteViewConnectionDelegate &delegate;
+    RemoteViewEvents events;
+    wl_registry *registry = nullptr;
+    favrin_remote_view_v1 *view = nullptr;
+    bool readySent = false;
+
+    static void global(void *data, wl_registry *registry, uint32_t name, const char *interface, uint32_t)
+    {
+        auto *self = static_cast<Private *>(data);
+        if (self->view || std::strcmp(interface, favrin_remote_view_v1_interface.name) != 0)
+            return;
+        self->view = static_cast<favrin_remote_view_v1 *>(
+            wl_registry_bind(registry, name, &favrin_remote_view_v1_interface, 1));
+        favrin_remote_view_v1_add_listener(self->view, &RemoteViewEvents::listener(), &self->events);
+    }
+    static void globalRemove(void *, wl_registry *, uint32_t) {}
+
+    void flush() const { wl_display_flush(display); }
+
+    void traitsDidArrive(const Traits &traits) override { delegate.traitsDidChange(traits); }
+    void configurationDidArrive(const Configuration &configuration) override
+    {
+        if (auto *controller = delegate.remoteViewController())
+            controller->setConfiguration(configuration);
+    }
+    void selectedColorDidArrive(const std::optional<platform::Color> &color,
+                                const std::optional<std::string> &colorspace) override
+    {
+        if (auto *controller = delegate.remoteViewController())
+            controller->setSelectedColor(color, colorspace);
+    }
+    void prepareForDisplayDidArrive(std::uint32_t serial) override
+    {
+        if (auto *controller = delegate.remoteViewController()) {
+            controller->prepareForDisplay([this, serial] {
+                favrin_remote_view_v1_prepared(view, serial);
+                flush();
+            });
+        }
+    }
+    void presentDidArrive() override { delegate.shouldPresent(); }
+    void colorPickerDidFinishDidArrive() override
+    {
+        if (auto *controller = delegate.remoteViewController())
+            controller->colorPickerDidFinish();
+    }
+};
+
+RemoteViewConnection::RemoteViewConnection(wl_display *display, RemoteViewConnectionDelegate &delegate)
+    : d(std::make_unique<Private>(display, delegate))
+{
+    static constexpr wl_registry_listener listener = {.global = Private::global, .global_remove = Private::globalRemove};
+    d->registry = wl_display_get_registry(display);
+    wl_registry_add_listener(d->registry, &listener, d.get());
+    d->flush();
+}
+
+RemoteViewConnection::~RemoteViewConnection()
+{
+    if (d->view)
+        favrin_remote_view_v1_destroy(d->view);
+    wl_registry_destroy(d->registry);
+    d->flush();
+}
+
+bool RemoteViewConnection::roundtrip()
+{
+    return wl_display_roundtrip(d->display) >= 0;
+}
+
+bool RemoteViewConnection::isBound() const
+{
+    return d->view != nullptr;
+}
+
+void RemoteViewConnection::sendReady()
+{
+    if (!d->view || std::exchange(d->readySent, true))
+        return;
+    favrin_remote_view_v1_ready(d->view);
+    d->flush();
+}
+
+void RemoteViewConnection::pickerDidSelectColor(const std::optional<platform::Color> &color,
+                                                const std::optional<std::string> &colorspace, bool isVolatile)
+{
+    if (!d->view)
+        return;
+    auto values = encodeColor(color);
+    auto array = wireArray(values);
+    const auto space = color && color->colorSpace() ? color->colorSpace()->name() : std::nullopt;
+    favrin_remote_view_v1_picker_did_select_color(d->view, &array, wireText(space), wireText(colorspace), isVolatile);
+    d->flush();
+}
+
+void RemoteViewConnection::pickerDidShowEyedropper()
+{
+    if (!d->view)
+        return;
+    favrin_remote_view_v1_picker_did_show_eyedropper(d->view);
+    d->flush();
+}
+
+void RemoteViewConnection::pickerDidFloatEyedropper()
+{
+    if (!d->view)
+        return;
+    favrin_remote_view_v1_picker_did_float_eyedropper(d->view);
+    d->flush();
+}
+
+void RemoteViewConnection::pickerDidDismissEyedropper()
+{
+    if (!d->view)
+        return;
+    favrin_remote_view_v1_picker_did_dismiss_eyedropper(d->view);
+    d->flush();
+}
+
+void RemoteViewConnection::colorPickerDidFinish()
+{
+    if (!d->view)
+        return;
+    favrin_remote_view_v1_color_picker_did_finish(d->view);
+    d->flush();
+}
+
+void RemoteViewConnection::preferredContentSizeDidChange(double width, double height)
+{
+    if (!d->view)
+        return;
+    favrin_remote_view_v1_set_preferred_content_size(d->view, wl_fixed_from_double(width), wl_fixed_from_double(height));
+    d->flush();
+}
+
+void RemoteViewConnection::backgroundEffectDidChange(BackgroundEffect effect)
+{
+    if (!d->view)
+        return;
+    favrin_remote_view_v1_set_background_effect(d->view, static_cast<uint32_t>(effect));
+    d->flush();
+}
+
+} // namespace favrin::remote::client
