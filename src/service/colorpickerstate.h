@@ -35,10 +35,15 @@ class ColorPickerState : public QObject, public platform::ObservableObject
     Q_PROPERTY(bool allowsNoColor READ readAllowsNoColor NOTIFY allowsNoColorChanged)
     Q_PROPERTY(bool showsAlpha READ readShowsAlpha NOTIFY showsAlphaChanged)
     Q_PROPERTY(bool showsEyedropper READ readShowsEyedropper NOTIFY showsEyedropperChanged)
+    Q_PROPERTY(
+        bool eyedropperShowing READ readEyedropperShowing WRITE setEyedropperShowing NOTIFY eyedropperShowingChanged)
+    Q_PROPERTY(bool eyedropperIsFloating READ readEyedropperIsFloating WRITE setEyedropperIsFloating NOTIFY
+                   eyedropperIsFloatingChanged)
     Q_PROPERTY(bool useLandscapeLayout READ readUseLandscapeLayout NOTIFY useLandscapeLayoutChanged)
     Q_PROPERTY(bool isEmbedded READ readIsEmbedded NOTIFY isEmbeddedChanged)
     Q_PROPERTY(bool isPopover READ readIsPopover NOTIFY isPopoverChanged)
     Q_PROPERTY(QSizeF size READ readSize NOTIFY sizeChanged)
+    Q_PROPERTY(bool animatesChanges READ animatesChanges NOTIFY animatesChangesChanged)
 
 public:
     explicit ColorPickerState(std::vector<model::SomeColor> favoriteColors, QObject *parent = nullptr);
@@ -65,7 +70,7 @@ public:
     platform::Published<bool> isPopover;
     platform::Published<QSizeF> size;
     /** Ends the presentation; none until the controller sets it. */
-    std::function<void()> close;
+    platform::Published<std::function<void()>> close;
     platform::Published<bool> enableDarkGrid;
     platform::Published<std::optional<ColorScheme>> overrideColorScheme;
 
@@ -84,10 +89,18 @@ public:
     bool readAllowsNoColor() const { return allowsNoColor(); }
     bool readShowsAlpha() const { return showsAlpha(); }
     bool readShowsEyedropper() const { return showsEyedropper(); }
+    bool readEyedropperShowing() const { return eyedropperShowing(); }
+    void setEyedropperShowing(bool showing) { eyedropperShowing.set(showing); }
+    bool readEyedropperIsFloating() const { return eyedropperIsFloating(); }
+    void setEyedropperIsFloating(bool floating) { eyedropperIsFloating.set(floating); }
     bool readUseLandscapeLayout() const { return useLandscapeLayout(); }
     bool readIsEmbedded() const { return isEmbedded(); }
     bool readIsPopover() const { return isPopover(); }
     QSizeF readSize() const { return size(); }
+
+    /** Makes @p change with the default animation: while it runs, animatesChanges is true and views may animate. */
+    void withAnimation(const std::function<void()> &change);
+    bool animatesChanges() const { return m_animatesChanges; }
 
     /** Runs the close action when there is one. */
     Q_INVOKABLE void performClose();
@@ -110,10 +123,16 @@ Q_SIGNALS:
     void isEmbeddedChanged();
     void isPopoverChanged();
     void sizeChanged();
+    void closeChanged();
     void enableDarkGridChanged();
     void overrideColorSchemeChanged();
 
+    void animatesChangesChanged();
+
 private:
+    void setAnimatesChanges(bool animates);
+
+    bool m_animatesChanges = false;
     std::optional<platform::Publisher<std::optional<platform::Color>>> m_finalColor;
     platform::Subscription m_objectWillChangeSink;
 };
