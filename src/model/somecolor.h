@@ -11,8 +11,9 @@
 namespace favrin::model {
 
 /**
- * The one color value: gamma-encoded components of a named space, nominally 0…1, and opacity. A plain immutable-by-habit
- * value, usable on any thread. Construction stores what it is given, bit for bit; only conversions clip.
+ * The one color value: gamma-encoded components of a named space, nominally 0…1, and opacity. A plain
+ * immutable-by-habit value, usable on any thread. Construction stores what it is given, bit for bit; only conversions
+ * clip.
  */
 class SomeColor
 {

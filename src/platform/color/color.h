@@ -37,28 +37,36 @@ private:
 };
 
 /** Rendering intents by the numbers of the 2-D graphics interface. Matrix spaces render alike with each of them. */
-enum class RenderingIntent { Default = 0, AbsoluteColorimetric = 1, RelativeColorimetric = 2, Perceptual = 3, Saturation = 4 };
+enum class RenderingIntent {
+    Default = 0,
+    AbsoluteColorimetric = 1,
+    RelativeColorimetric = 2,
+    Perceptual = 3,
+    Saturation = 4
+};
 
 /**
- * A transform into a standard-range RGB space. Taken from a process-wide cache keyed by the target; usable on any thread.
+ * A transform into a standard-range RGB space. Taken from a process-wide cache keyed by the target; usable on any
+ * thread.
  */
 class ColorTransform
 {
 public:
-    /** The cached transform into the RGB space called @p targetName; null for a name that is no standard-range RGB space. */
+    /** The cached transform into the RGB space called @p targetName; null for a name that is no standard-range RGB
+     * space. */
     static std::shared_ptr<const ColorTransform> into(std::string_view targetName);
 
     /**
      * The color components of @p color in the target space, clipped to 0…1.
      *
      * A color already in the same standard-range space is clipped and nothing else. A color without a space, or with a
-     * component that is not a number, has no result.
+     * component that is not finite (or becomes so on the way), has no result.
      */
     std::optional<Triple> convert(const Color &color, RenderingIntent intent) const;
 
 private:
-    explicit ColorTransform(ColorSpace target);
-    ColorSpace m_target;
+    explicit ColorTransform(ColorSpace::Model target);
+    ColorSpace::Model m_target;
 };
 
 } // namespace favrin::platform

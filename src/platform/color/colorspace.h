@@ -33,6 +33,9 @@ class ColorSpace
 public:
     enum class Range { Standard, Extended };
 
+    /** What the components mean; Custom is a space of its own matrix and curve. */
+    enum class Model { SRGB, DisplayP3, ExtendedSRGB, LinearSRGB, Gray, Custom };
+
     /** The space known under @p name (see colorspacename), or none for a name that is not known. */
     static std::optional<ColorSpace> named(std::string_view name);
 
@@ -44,15 +47,16 @@ public:
     static ColorSpace gray();
 
     /**
-     * A space without a name, of standard range.
+     * A space without a name, of standard range. Equal to another made from equal arguments.
      * @param toLinearSRGB row-major matrix from the space's linear components to linear sRGB (D65)
      * @param decode the transfer curve, from an encoded component to linear light; called on any thread
      */
-    static ColorSpace unnamed(const std::array<Triple, 3> &toLinearSRGB, double (*decode)(double encoded, double parameter),
-                              double parameter);
+    static ColorSpace unnamed(const std::array<Triple, 3> &toLinearSRGB,
+                              double (*decode)(double encoded, double parameter), double parameter);
 
     /** The platform name, or none for a space that has no name. */
     std::optional<std::string> name() const;
+    Model model() const;
     /** 1 for gray, otherwise 3. */
     std::size_t componentCount() const;
     Range range() const;
