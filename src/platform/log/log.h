@@ -1,5 +1,6 @@
 #pragma once
 
+#include <memory>
 #include <string_view>
 
 namespace favrin::platform {
@@ -7,12 +8,12 @@ namespace favrin::platform {
 /**
  * One log object with a subsystem and a category, e.g. "com.quenta.favrin.ColorPicker" and "ColorPicker".
  * Entries go to Qt's logging under the category name "<subsystem>.<category>" and obey its filter rules; debug entries
- * are off unless a rule turns them on. Thread-safe.
+ * are off unless a rule turns them on. Messages are UTF-8. Thread-safe.
  */
 class Log
 {
 public:
-    /** Both texts must outlive the log: use literals. */
+    /** Both texts are copied. */
     Log(const char *subsystem, const char *category);
     ~Log();
     Log(const Log &) = delete;
@@ -26,7 +27,7 @@ public:
 
 private:
     struct Private;
-    Private *d;
+    std::unique_ptr<Private> d;
 };
 
 } // namespace favrin::platform

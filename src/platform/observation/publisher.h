@@ -65,7 +65,8 @@ public:
     {
         using Result = std::decay_t<std::invoke_result_t<Transform, const Value &>>;
         return Publisher<Result>([source = *this, transform](typename Publisher<Result>::Receive receive) {
-            return source.sink([transform, receive = std::move(receive)](const Value &value) { receive(transform(value)); });
+            return source.sink(
+                [transform, receive = std::move(receive)](const Value &value) { receive(transform(value)); });
         });
     }
 

@@ -12,10 +12,13 @@ public:
     virtual void async(std::function<void()> work) = 0;
 };
 
-/** Runs work on the main thread, in the order it was given, through the event loop. */
+/**
+ * Runs work on the thread of the application object, in the order it was given, through the event loop. Work given
+ * before there is an application waits for it; work given after it is gone, or not yet run then, is dropped.
+ */
 Queue &mainQueue();
 
-/** The shared concurrent queue of default priority. */
+/** The shared concurrent queue of default priority: Qt's global thread pool. Dropped once the application is gone. */
 Queue &backgroundQueue();
 
 } // namespace favrin::platform

@@ -80,8 +80,7 @@ private Q_SLOTS:
         QTest::addRow("complete with the second") << QStringLiteral("a1 b1") << QStringLiteral("1,1");
         QTest::addRow("complete with the first") << QStringLiteral("b1 a1") << QStringLiteral("1,1");
         QTest::addRow("earlier values are gone") << QStringLiteral("a1 a2 b1") << QStringLiteral("2,1");
-        QTest::addRow("either side emits") << QStringLiteral("a1 b1 a2 b2 b2")
-                                           << QStringLiteral("1,1 2,1 2,2 2,2");
+        QTest::addRow("either side emits") << QStringLiteral("a1 b1 a2 b2 b2") << QStringLiteral("1,1 2,1 2,2 2,2");
     }
     void latestOfTwo()
     {
@@ -90,9 +89,10 @@ private Q_SLOTS:
         Subject<int> a;
         Subject<int> b;
         QStringList log;
-        const auto subscription = combineLatest(a.publisher(), b.publisher()).sink([&](const std::pair<int, int> &pair) {
-            log << QStringLiteral("%1,%2").arg(pair.first).arg(pair.second);
-        });
+        const auto subscription =
+            combineLatest(a.publisher(), b.publisher()).sink([&](const std::pair<int, int> &pair) {
+                log << QStringLiteral("%1,%2").arg(pair.first).arg(pair.second);
+            });
         for (const auto &step : sent.split(u' '))
             (step.startsWith(u'a') ? a : b).send(step.mid(1).toInt());
         QCOMPARE(log.join(u' '), received);
