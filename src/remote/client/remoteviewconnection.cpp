@@ -5,16 +5,11 @@
 #include "remote/wirecolor.h"
 
 #include <cstring>
+#include <utility>
 
 namespace favrin::remote::client {
 
 namespace {
-
-/** A borrowed view of numbers as the wire's array type. */
-wl_array wireArray(std::vector<double> &values)
-{
-    return {.size = values.size() * sizeof(double), .alloc = 0, .data = values.data()};
-}
 
 const char *wireText(const std::optional<std::string> &text)
 {
@@ -119,10 +114,12 @@ void RemoteViewConnection::pickerDidSelectColor(const std::optional<platform::Co
 {
     if (!d->view)
         return;
-    auto values = encodeColor(color);
-    auto array = wireArray(values);
-    const auto space = color && color->colorSpace() ? color->colorSpace()->name() : std::nullopt;
-    favrin_remote_view_v1_picker_did_select_color(d->view, &array, wireText(space), wireText(colorspace), isVolatile);
+    auto wire = encodeColor(color);
+    if (!wire)
+        return;
+    wl_array array = {.size = wire->numbers.size() * sizeof(double), .alloc = 0, .data = wire->numbers.data()};
+    favrin_remote_view_v1_picker_did_select_color(d->view, &array, wireText(wire->space), wireText(colorspace),
+                                                  isVolatile);
     d->flush();
 }
 

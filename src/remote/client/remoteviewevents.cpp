@@ -4,28 +4,27 @@
 #include "remote/limits.h"
 #include "remote/sanitized.h"
 #include "remote/wirecolor.h"
+#include "remote/wireoptions.h"
 #include "remote/wiretext.h"
 
-#include <cstring>
 #include <span>
+#include <utility>
 
 namespace favrin::remote::client {
 
 namespace {
 
-std::vector<double> numbers(const wl_array *array)
+std::span<const std::byte> bytes(const wl_array *array)
 {
-    std::vector<double> result(array->size / sizeof(double));
-    if (!result.empty())
-        std::memcpy(result.data(), array->data, result.size() * sizeof(double));
-    return result;
+    return {static_cast<const std::byte *>(array->data), array->size};
 }
 
 std::optional<std::string> optionalText(const char *text)
 {
     if (!text)
         return std::nullopt;
-    return sanitizedText(text, limits::textBytes);
+    // A text that is no text is treated like one that is missing.
+    return sendableText(text, limits::textBytes);
 }
 
 } // namespace
@@ -59,9 +58,7 @@ struct RemoteViewEvents::Handlers
     static void locale(void *data, favrin_remote_view_v1 *, const char *name) { self(data).m_traits.locale = name; }
     static void accessibilityOptions(void *data, favrin_remote_view_v1 *, uint32_t options)
     {
-        auto &traits = self(data).m_traits;
-        traits.reduceMotion = options & FAVRIN_REMOTE_VIEW_V1_ACCESSIBILITY_OPTION_REDUCE_MOTION;
-        traits.increaseContrast = options & FAVRIN_REMOTE_VIEW_V1_ACCESSIBILITY_OPTION_INCREASE_CONTRAST;
+        applyAccessibilityBits(options, self(data).m_traits);
     }
     static void traitsDone(void *data, favrin_remote_view_v1 *)
     {
@@ -74,26 +71,13 @@ struct RemoteViewEvents::Handlers
     static void suggestedColors(void *data, favrin_remote_view_v1 *, const char *space, wl_array *colors)
     {
         auto &list = self(data).m_suggestedColors;
-        for (auto &color : decodeColorRun(numbers(colors), space)) {
-            if (list.size() == limits::suggestedColors)
-                return;
-            list.push_back(std::move(color));
-        }
+        const auto run = decodeColorRun(bytes(colors), space);
+        if (run && list.size() + run->size() <= limits::suggestedColors)
+            list.insert(list.end(), run->begin(), run->end());
     }
     static void options(void *data, favrin_remote_view_v1 *, uint32_t options)
     {
-        auto &events = self(data);
-        auto &configuration = events.m_configuration;
-        const auto isSet = [options](uint32_t flag) { return (options & flag) != 0; };
-        configuration.showsAlpha = isSet(FAVRIN_REMOTE_VIEW_V1_OPTION_SHOWS_ALPHA);
-        configuration.allowsNoColor = isSet(FAVRIN_REMOTE_VIEW_V1_OPTION_ALLOWS_NO_COLOR);
-        configuration.showsEyedropper = isSet(FAVRIN_REMOTE_VIEW_V1_OPTION_SHOWS_EYEDROPPER);
-        configuration.shouldUseDarkGridInDarkMode = isSet(FAVRIN_REMOTE_VIEW_V1_OPTION_USES_DARK_GRID_IN_DARK_MODE);
-        configuration.isEmbedded = isSet(FAVRIN_REMOTE_VIEW_V1_OPTION_IS_EMBEDDED);
-        if (isSet(FAVRIN_REMOTE_VIEW_V1_OPTION_HAS_TITLE))
-            configuration.title.emplace();
-        if (isSet(FAVRIN_REMOTE_VIEW_V1_OPTION_HAS_SUGGESTED_COLORS))
-            configuration.suggestedColors.emplace();
+        applyOptionBits(options, self(data).m_configuration);
     }
     static void gridStyle(void *data, favrin_remote_view_v1 *, int32_t style)
     {
@@ -101,20 +85,21 @@ struct RemoteViewEvents::Handlers
     }
     static void hostWindow(void *data, favrin_remote_view_v1 *, wl_array *geometry)
     {
-        const auto values = numbers(geometry);
-        if (values.size() != 3)
+        const auto values = decodeNumbers(bytes(geometry), 3);
+        if (!values)
             return;
         auto &configuration = self(data).m_configuration;
-        configuration.hostWindowWidth = values[0];
-        configuration.hostWindowHeight = values[1];
-        configuration.keyboardSpace = values[2];
+        configuration.hostWindowWidth = (*values)[0];
+        configuration.hostWindowHeight = (*values)[1];
+        configuration.keyboardSpace = (*values)[2];
     }
     static void configurationDone(void *data, favrin_remote_view_v1 *) { self(data).finishConfiguration(); }
 
     static void setSelectedColor(void *data, favrin_remote_view_v1 *, wl_array *color, const char *space,
                                  const char *colorspace)
     {
-        const auto decoded = decodeColor(numbers(color), optionalText(space));
+        const auto spaceName = optionalText(space);
+        const auto decoded = decodeColor(bytes(color), spaceName);
         // A color that makes no sense is no message at all: the picker keeps what it has.
         if (decoded)
             self(data).m_receiver.selectedColorDidArrive(*decoded, optionalText(colorspace));
