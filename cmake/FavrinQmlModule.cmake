@@ -12,6 +12,12 @@
 function(favrin_qml_module target)
     cmake_parse_arguments(arg "" "URI" "SOURCES;QML_FILES;RESOURCES;MODULES" ${ARGN})
     string(REPLACE "." "/" path "${arg_URI}")
+    # A property's type must be known from the module alone: QtQuick holds color and font.
+    set(dependencies QtQuick)
+    foreach(module IN LISTS arg_MODULES)
+        get_target_property(uri ${module} QT_QML_MODULE_URI)
+        list(APPEND dependencies ${uri})
+    endforeach()
     qt_add_library(${target} STATIC)
     qt_add_qml_module(${target}
         URI ${arg_URI}
@@ -22,6 +28,7 @@ function(favrin_qml_module target)
         SOURCES ${arg_SOURCES}
         QML_FILES ${arg_QML_FILES}
         RESOURCES ${arg_RESOURCES}
+        DEPENDENCIES ${dependencies}
     )
     # Our warnings are for our own code.
     get_target_property(sources ${target} SOURCES)
