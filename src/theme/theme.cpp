@@ -109,9 +109,9 @@ int Theme::barSymbolSize() const
 void Theme::updateColors()
 {
     m_colors = semanticColors(m_colorScheme, m_contrast);
-    for (QColor *color : {&m_colors.label, &m_colors.secondaryLabel, &m_colors.tertiaryLabel, &m_colors.systemBackground,
-                          &m_colors.systemGray, &m_colors.systemGray5, &m_colors.systemRed, &m_colors.separator,
-                          &m_colors.tint, &m_colors.fill})
+    for (QColor *color : {&m_colors.label, &m_colors.secondaryLabel, &m_colors.tertiaryLabel,
+                          &m_colors.systemBackground, &m_colors.systemGray, &m_colors.systemGray5, &m_colors.systemRed,
+                          &m_colors.separator, &m_colors.tint, &m_colors.fill})
         *color = DisplayColor::instance().interfaceColor(*color);
     Q_EMIT colorsChanged();
 }

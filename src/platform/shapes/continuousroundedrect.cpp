@@ -13,7 +13,8 @@ constexpr double preferredSmoothing = 0.6;
 
 /**
  * One corner at the origin, coming along the top edge from the left and leaving down the right edge: two easing curves
- * with the rest of the quarter circle between them. The curvature of an easing curve grows from 0 to that of the circle.
+ * with the rest of the quarter circle between them. The curvature of an easing curve grows from 0 to that of the
+ * circle.
  */
 struct Corner
 {
@@ -47,12 +48,14 @@ void addCorner(QPainterPath &path, const Corner &corner, double radius, const QT
     const QPointF arcEnd(arcStart.x() + corner.arcChord, arcStart.y() + corner.arcChord);
 
     path.lineTo(at(-corner.extent, 0.0));
-    path.cubicTo(at(-corner.extent + corner.far, 0.0), at(-corner.extent + corner.far + corner.near, 0.0), place.map(arcStart));
+    path.cubicTo(at(-corner.extent + corner.far, 0.0), at(-corner.extent + corner.far + corner.near, 0.0),
+                 place.map(arcStart));
     const double turn = (std::numbers::pi / 2.0 - corner.arcSpan) / 2.0;
     const double handle = 4.0 / 3.0 * std::tan(corner.arcSpan / 4.0) * radius;
     const QPointF along(std::cos(turn) * handle, std::sin(turn) * handle);
     path.cubicTo(place.map(arcStart + along), place.map(arcEnd - QPointF(along.y(), along.x())), place.map(arcEnd));
-    path.cubicTo(at(0.0, corner.extent - corner.far - corner.near), at(0.0, corner.extent - corner.far), at(0.0, corner.extent));
+    path.cubicTo(at(0.0, corner.extent - corner.far - corner.near), at(0.0, corner.extent - corner.far),
+                 at(0.0, corner.extent));
 }
 
 } // namespace

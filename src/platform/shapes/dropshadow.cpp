@@ -7,7 +7,8 @@
 namespace favrin::platform {
 namespace {
 
-/** One running mean of @p width values along a line of @p count values that lie @p stride apart; zero beyond the ends. */
+/** One running mean of @p width values along a line of @p count values that lie @p stride apart; zero beyond the ends.
+ */
 void boxBlur(float *values, int count, int stride, int width, std::vector<float> &scratch)
 {
     const int before = width / 2;

@@ -1,0 +1,49 @@
+import QtQuick
+import QtQuick.Templates as T
+import Favrin.Theme
+
+/* The round close button. Its touch area is larger than its face. */
+T.AbstractButton {
+    id: button
+
+    /* What the button is called. */
+    required property string label
+
+    readonly property real diameter: 30
+    readonly property real touchArea: 44
+
+    implicitWidth: diameter
+    implicitHeight: diameter
+    focusPolicy: Qt.StrongFocus
+    hoverEnabled: true
+    containmentMask: Item {
+        x: (button.width - width) / 2
+        y: (button.height - height) / 2
+        width: button.touchArea
+        height: button.touchArea
+    }
+
+    Accessible.role: Accessible.Button
+    Accessible.name: label
+    Accessible.onPressAction: button.clicked()
+    Keys.onReturnPressed: button.clicked()
+    Keys.onEnterPressed: button.clicked()
+
+    background: CloseGlyph {
+        discColor: Theme.fill
+        crossColor: Theme.secondaryLabel
+        opacity: button.pressed ? 0.5 : 1
+
+        Rectangle {
+            anchors.fill: parent
+            radius: width / 2
+            color: Theme.fill
+            visible: button.hovered && !button.pressed
+        }
+    }
+
+    FocusRing {
+        parentRadius: button.diameter / 2
+        visible: button.visualFocus
+    }
+}
