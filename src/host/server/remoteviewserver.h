@@ -53,6 +53,10 @@ struct TextInputState
     /** Points of the surface. */
     PixelRect cursorRectangle;
     std::string preferredLanguage;
+    /** The service asks for an input panel, such as an on-screen keyboard. */
+    bool wantsInputPanel = false;
+    /** Grows when text that is being composed is to be forgotten. */
+    std::uint32_t resets = 0;
 
     bool operator==(const TextInputState &) const = default;
 };
@@ -70,7 +74,8 @@ enum class CloseReason {
     LimitExceeded,
 };
 
-/** What comes from the service. Called from dispatch(), on its thread. A call may destroy the server only by way of a later turn. */
+/** What comes from the service. Called from dispatch(), on its thread. A call may destroy the server only by way of a
+ * later turn. */
 class RemoteViewServerDelegate
 {
 public:
@@ -83,7 +88,8 @@ public:
     virtual void serviceDidBind() = 0;
     virtual void serviceIsReady() = 0;
     virtual void serviceDidPrepare(std::uint32_t serial) = 0;
-    /** @p colorspace is the name that the message to the app carries, which may be missing though the color has a space. */
+    /** @p colorspace is the name that the message to the app carries, which may be missing though the color has a
+     * space. */
     virtual void pickerDidSelectColor(const std::optional<platform::Color> &color,
                                       const std::optional<std::string> &colorspace, bool isVolatile) = 0;
     virtual void pickerDidShowEyedropper() = 0;
@@ -99,12 +105,18 @@ public:
     virtual void serviceDidOfferClipboard(const std::vector<std::string> &mimeTypes) = 0;
     /** The service wants the host's clipboard in this type: write it to @p descriptor and close it, on any thread. */
     virtual void serviceWantsClipboard(const std::string &mimeType, int descriptor) = 0;
-    /** Name of the pointer's shape by the cursor naming of the desktop ("default", "text", "pointer"); empty hides it. */
+    /**
+     * Name of the pointer's shape by the cursor naming of the desktop; empty hides it. The service shows pictures, of
+     * which no name is known: what is not hidden is "default".
+     */
     virtual void cursorDidChange(const std::string &name) = 0;
     /** Ping not answered for a while; it will be told again when the service answers. */
     virtual void serviceResponsivenessDidChange(bool responsive) = 0;
 
-    /** The last call: nothing comes after it. */
+    /** Something that the owner asked for was cut or left out; for the log. */
+    virtual void serverDidWarn(const std::string &message) { static_cast<void>(message); }
+
+    /** The last call: nothing comes after it. Not called for closeConnection(). */
     virtual void connectionDidClose(CloseReason reason, const std::string &detail) = 0;
 };
 
@@ -113,8 +125,8 @@ public:
  *
  * Knows no toolkit. The owner watches fileDescriptor() and calls dispatch() when it is readable; calls that send
  * something are flushed by flush(), which the owner calls before it goes back to its event loop. One thread.
- * Offered: compositor, subcompositor, shm, seat (pointer, keyboard, touch), output, xdg_wm_base (popups are dismissed at
- * once), text-input-unstable-v1, data device, favrin_remote_view_v1. Limits per client are in serverlimits.h.
+ * Offered: compositor, subcompositor, shm, seat (pointer, keyboard, touch), output, xdg_wm_base (popups are dismissed
+ * at once), text-input-unstable-v1, data device, favrin_remote_view_v1. Limits per client are in serverlimits.h.
  */
 class RemoteViewServer
 {
@@ -155,7 +167,8 @@ public:
     /** @p button is the evdev code (BTN_LEFT is 0x110). */
     void pointerButton(std::uint32_t time, std::uint32_t button, bool pressed);
     /** Scrolling in points; whole wheel clicks in @p discrete (0 for a touchpad). Positive is down or right. */
-    void pointerAxis(std::uint32_t time, double horizontal, double vertical, int horizontalDiscrete, int verticalDiscrete);
+    void pointerAxis(std::uint32_t time, double horizontal, double vertical, int horizontalDiscrete,
+                     int verticalDiscrete);
     void pointerFrame();
 
     void touchDown(std::uint32_t time, int id, double x, double y);
