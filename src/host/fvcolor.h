@@ -41,8 +41,9 @@ public:
     FVColor(double red, double green, double blue, double alpha = 1.0, const QString &colorSpace = sRGBName());
 
     /**
-     * The color of numbers that @p space interprets. sRGB, Display P3 and linear sRGB keep their numbers; a color of any
-     * other space becomes extended sRGB. An invalid color becomes no color.
+     * The color of numbers that @p space interprets. sRGB, Display P3 and linear sRGB keep their numbers; a color of
+     * another space becomes linear sRGB without loss, one of a space that only Qt can read (a display profile, say)
+     * becomes sRGB. An invalid color becomes no color.
      */
     static FVColor fromQColor(const QColor &color, const QColorSpace &space = QColorSpace(QColorSpace::SRgb));
     /** As QColor reads it: in sRGB, clipped to 0…1. Invalid for no color. */

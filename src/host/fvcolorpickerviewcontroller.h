@@ -18,11 +18,11 @@ class QQuickWindow;
  * A color picker for an app: shown inside the app's window, running in a process of its own.
  *
  * Set what the picker shall show, then present() it over a window, presentPopover() it beside an item, or place view()
- * in a scene of your own. The picker reports every color the user picks through pickerDidSelectColor(): volatile ones while a
- * gesture goes on, then the last one again as final. A color set by the app is never reported back.
+ * in a scene of your own. The picker reports every color the user picks through pickerDidSelectColor(): volatile ones
+ * while a gesture goes on, then the last one again as final. A color set by the app is never reported back.
  *
- * The picker's process may end at any moment; colorPickerViewServiceDidTerminateWithError() says so, and presenting again works. No call
- * waits for that process. Sizes are in points (device-independent pixels). GUI thread only.
+ * The picker's process may end at any moment; colorPickerViewServiceDidTerminateWithError() says so, and presenting
+ * again works. No call waits for that process. Sizes are in points (device-independent pixels). GUI thread only.
  */
 class FAVRIN_HOST_EXPORT FVColorPickerViewController : public QObject
 {
@@ -104,7 +104,8 @@ public:
     void setTitle(const QString &title);
     void resetTitle();
 
-    /** What the app set or the user picked last; no color while there is none. Setting it never comes back as a pick. */
+    /** What the app set or the user picked last; no color while there is none. Setting it never comes back as a pick.
+     */
     FVColor selectedColor() const;
     /**
      * Shows @p color in the picker. It works in the color's own space when that is sRGB or Display P3, otherwise in the
@@ -164,7 +165,8 @@ public:
 
     /** How large the picker would like to be; 0 × 0 until it has said so. */
     QSizeF preferredContentSize() const;
-    /** The picker wants a translucent material behind it. Presented pickers have it drawn; view() leaves it to the app. */
+    /** The picker wants a translucent material behind it. Presented pickers have it drawn; view() leaves it to the app.
+     */
     bool wantsMaterial() const;
 
     State state() const;

@@ -37,8 +37,8 @@ struct RemoteViewConnection::Private : RemoteViewEventsReceiver
         auto *self = static_cast<Private *>(data);
         if (self->view || std::strcmp(interface, favrin_remote_view_v1_interface.name) != 0)
             return;
-        self->view = static_cast<favrin_remote_view_v1 *>(
-            wl_registry_bind(registry, name, &favrin_remote_view_v1_interface, 1));
+        self->view =
+            static_cast<favrin_remote_view_v1 *>(wl_registry_bind(registry, name, &favrin_remote_view_v1_interface, 1));
         favrin_remote_view_v1_add_listener(self->view, &RemoteViewEvents::listener(), &self->events);
     }
     static void globalRemove(void *, wl_registry *, uint32_t) {}
@@ -77,7 +77,8 @@ struct RemoteViewConnection::Private : RemoteViewEventsReceiver
 RemoteViewConnection::RemoteViewConnection(wl_display *display, RemoteViewConnectionDelegate &delegate)
     : d(std::make_unique<Private>(display, delegate))
 {
-    static constexpr wl_registry_listener listener = {.global = Private::global, .global_remove = Private::globalRemove};
+    static constexpr wl_registry_listener listener = {.global = Private::global,
+                                                      .global_remove = Private::globalRemove};
     d->registry = wl_display_get_registry(display);
     wl_registry_add_listener(d->registry, &listener, d.get());
     d->flush();
@@ -159,7 +160,8 @@ void RemoteViewConnection::preferredContentSizeDidChange(double width, double he
 {
     if (!d->view)
         return;
-    favrin_remote_view_v1_set_preferred_content_size(d->view, wl_fixed_from_double(width), wl_fixed_from_double(height));
+    favrin_remote_view_v1_set_preferred_content_size(d->view, wl_fixed_from_double(width),
+                                                     wl_fixed_from_double(height));
     d->flush();
 }
 

@@ -3,7 +3,6 @@
 #include "remote/records.h"
 #include "remote/remotehost.h"
 
-
 #include <memory>
 
 struct wl_display;
@@ -27,7 +26,8 @@ public:
  * The service's end of favrin_remote_view_v1: translates wire events into records and messages, and messages into
  * requests. Everything that comes in is checked and made sane here; nothing the host sends ends the process.
  *
- * Events are delivered on the main thread by the dispatching of Qt's Wayland plugin. Requests may be sent on any thread.
+ * Events are delivered on the main thread by the dispatching of Qt's Wayland plugin. Requests may be sent on any
+ * thread.
  */
 class RemoteViewConnection : public RemoteHost
 {

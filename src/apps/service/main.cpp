@@ -1,0 +1,56 @@
+#include "apps/service/pickerservice.h"
+#include "service/fvcolorpickerserviceviewcontroller.h"
+#include "shell/colorpickerviewfactory.h"
+
+#include <QGuiApplication>
+#include <QQmlEngine>
+#include <QQuickItem>
+#include <QQuickWindow>
+
+#include <cstdio>
+
+namespace {
+
+constexpr int noHost = 3;
+
+/** What Qt must know before it starts: the host's private server, drawing by the processor, frames without waiting. */
+void prepareEnvironment()
+{
+    qputenv("QT_QPA_PLATFORM", "wayland");
+    qputenv("QT_QUICK_BACKEND", "software");
+    qputenv("QSG_RENDER_LOOP", "basic");
+    qputenv("QT_WAYLAND_DISABLE_WINDOWDECORATION", "1");
+    qputenv("QT_WAYLAND_SHELL_INTEGRATION", "xdg-shell");
+    qputenv("QT_WAYLAND_TEXT_INPUT_PROTOCOL", "zwp_text_input_v1");
+    // The toolkit's idle wait before each frame would cost every step of a drag 5 ms.
+    qputenv("QT_QPA_UPDATE_IDLE_TIME", "0");
+    qunsetenv("QT_IM_MODULE");
+    QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
+}
+
+} // namespace
+
+int main(int argc, char *argv[])
+{
+    if (qEnvironmentVariableIsEmpty("WAYLAND_SOCKET")) {
+        std::fputs("favrin-color-picker-service: started by applications that show a color picker, not by hand\n",
+                   stderr);
+        return noHost;
+    }
+    prepareEnvironment();
+    QGuiApplication application(argc, argv);
+    QGuiApplication::setApplicationName(QStringLiteral("favrin-color-picker-service"));
+    QGuiApplication::setDesktopFileName(QStringLiteral("favrin-color-picker"));
+
+    QQmlEngine engine;
+    favrin::shell::ColorPickerViewFactory views(engine);
+    favrin::service::FVColorPickerServiceViewController::registerClass(
+        [&views](favrin::service::ColorPickerState *state) { return views.create(*state); });
+    auto *display = favrin::remote::client::qtWaylandDisplay();
+    if (!display)
+        return noHost;
+    favrin::apps::PickerService service(display);
+    if (!service.connectToHost())
+        return noHost;
+    return QGuiApplication::exec();
+}

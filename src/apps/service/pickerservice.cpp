@@ -1,0 +1,115 @@
+#include "apps/service/pickerservice.h"
+
+#include "platform/color/displaygamut.h"
+#include "platform/strings/translationtable.h"
+#include "remote/limits.h"
+#include "service/displaycolor.h"
+#include "service/fvcolorpickerservicefront.h"
+#include "theme/theme.h"
+
+#include <QGuiApplication>
+#include <QLocale>
+#include <QQuickItem>
+#include <QQuickWindow>
+#include <QSurfaceFormat>
+
+namespace favrin::apps {
+
+namespace {
+
+platform::TraitCollection traitCollection(const remote::Traits &traits)
+{
+    const bool dark = traits.appearance == remote::Appearance::Dark;
+    return {.presentationContext = static_cast<platform::PresentationContext>(traits.presentationContext),
+            .userInterfaceStyle = dark ? platform::UserInterfaceStyle::Dark : platform::UserInterfaceStyle::Light};
+}
+
+} // namespace
+
+PickerService::PickerService(wl_display *display) : m_connection(display, *this) {}
+
+PickerService::~PickerService() = default;
+
+bool PickerService::connectToHost()
+{
+    // The first brings the globals; what the host has to say follows with the event loop.
+    return m_connection.roundtrip() && m_connection.isBound();
+}
+
+remote::RemoteViewController *PickerService::remoteViewController()
+{
+    return m_front.get();
+}
+
+void PickerService::traitsDidChange(const remote::Traits &traits)
+{
+    const bool first = !m_traits;
+    applySurroundings(traits);
+    m_traits = traits;
+    if (first)
+        build();
+    m_front->eyedropper().setDisplayIdentifier(traits.displayIdentifier);
+    m_front->setTraits(traitCollection(traits));
+    if (first)
+        m_connection.sendReady();
+}
+
+void PickerService::applySurroundings(const remote::Traits &traits)
+{
+    const bool p3 = traits.displayGamut == remote::DisplayGamut::P3;
+    // The default space of the device is decided once, by the first color that is made.
+    if (!m_traits)
+        platform::setDisplayGamut(p3 ? platform::DisplayGamut::P3 : platform::DisplayGamut::SRGB);
+    service::DisplayColor::instance().setSurfaceColorSpace(p3 ? model::SomeColor::ColorSpace::displayP3
+                                                              : model::SomeColor::ColorSpace::sRGB);
+    if (!m_traits || m_traits->locale != traits.locale) {
+        const auto name = QString::fromStdString(traits.locale);
+        QLocale::setDefault(name.isEmpty() ? QLocale::system() : QLocale(name));
+        platform::installTranslations(QLocale().bcp47Name());
+    }
+    const auto direction =
+        traits.layoutDirection == remote::LayoutDirection::RightToLeft ? Qt::RightToLeft : Qt::LeftToRight;
+    QGuiApplication::setLayoutDirection(direction);
+    auto &theme = theme::Theme::instance();
+    theme.setColorScheme(traits.appearance == remote::Appearance::Dark ? service::ColorScheme::Dark
+                                                                       : service::ColorScheme::Light);
+    theme.setTextSizeCategory(static_cast<theme::TextSizeCategory>(traits.textSizeCategory));
+    theme.setIncreaseContrast(traits.increaseContrast);
+    theme.setReduceMotion(traits.reduceMotion);
+    theme.setLayoutDirection(direction);
+}
+
+void PickerService::build()
+{
+    m_front = std::make_unique<service::FVColorPickerServiceFront>([this] { return &m_connection; });
+    m_window = std::make_unique<QQuickWindow>();
+    m_window->setFlag(Qt::FramelessWindowHint);
+    m_window->setColor(Qt::transparent);
+    auto format = m_window->format();
+    format.setAlphaBufferSize(8);
+    m_window->setFormat(format);
+    // The platform plugin fails on absurd sizes; these bound what it will accept from the host.
+    m_window->setMinimumSize(QSize(1, 1));
+    m_window->setMaximumSize(QSize(remote::limits::largestSurface, remote::limits::largestSurface));
+    m_front->view()->setParentItem(m_window->contentItem());
+    connect(m_window.get(), &QQuickWindow::widthChanged, this, &PickerService::followWindowSize);
+    connect(m_window.get(), &QQuickWindow::heightChanged, this, &PickerService::followWindowSize);
+}
+
+void PickerService::followWindowSize()
+{
+    m_front->view()->setSize(m_window->contentItem()->size());
+}
+
+void PickerService::shouldPresent()
+{
+    if (!m_front || m_window->isVisible())
+        return;
+    m_front->reloadPersistedValues();
+    m_front->setAppeared(true);
+    m_window->show();
+    followWindowSize();
+    m_front->view()->forceActiveFocus();
+}
+
+} // namespace favrin::apps

@@ -1,0 +1,121 @@
+#include "host/fvcolorpickerviewcontroller.h"
+
+#include "host/colorbridge.h"
+#include "host/fvcolorpickerviewcontroller_p.h"
+#include "host/remoteviewitem.h"
+#include "host/serviceahead.h"
+#include "host/serviceprocess.h"
+
+#include <QQuickWindow>
+
+using favrin::host::PresentationStyle;
+using favrin::host::RemotePicker;
+
+FVColorPickerViewController::Private::Private(FVColorPickerViewController &controller)
+{
+    auto *self = &controller;
+    QObject::connect(&picker, &RemotePicker::picked, self,
+                     [this, self](const auto &color, const auto &colorspace, bool isVolatile) {
+                         selectedColor = favrin::host::toPublicColor(color);
+                         Q_EMIT self->selectedColorChanged();
+                         Q_EMIT self->pickerDidSelectColor(
+                             selectedColor, colorspace ? QString::fromStdString(*colorspace) : QString(), isVolatile);
+                     });
+    QObject::connect(&picker, &RemotePicker::eyedropperShown, self,
+                     &FVColorPickerViewController::pickerDidShowEyedropper);
+    QObject::connect(&picker, &RemotePicker::eyedropperFloated, self,
+                     &FVColorPickerViewController::pickerDidFloatEyedropper);
+    QObject::connect(&picker, &RemotePicker::eyedropperDismissed, self,
+                     &FVColorPickerViewController::pickerDidDismissEyedropper);
+    QObject::connect(&picker, &RemotePicker::finished, self, &FVColorPickerViewController::colorPickerDidFinish);
+    QObject::connect(&picker, &RemotePicker::terminated, self,
+                     &FVColorPickerViewController::colorPickerViewServiceDidTerminateWithError);
+    QObject::connect(&picker, &RemotePicker::stateChanged, self, &FVColorPickerViewController::stateChanged);
+    QObject::connect(&picker, &RemotePicker::preferredContentSizeChanged, self, [this, self](QSizeF size) {
+        preferredContentSize = size;
+        Q_EMIT self->preferredContentSizeChanged();
+    });
+    QObject::connect(&picker, &RemotePicker::materialChanged, self, [this, self](bool wanted) {
+        wantsMaterial = wanted;
+        Q_EMIT self->wantsMaterialChanged();
+    });
+    QObject::connect(&picker, &RemotePicker::surroundingsChanged, self, [self] {
+        Q_EMIT self->hostWindowSizeChanged();
+        Q_EMIT self->keyboardSpaceChanged();
+    });
+}
+
+FVColorPickerViewController::FVColorPickerViewController(QObject *parent)
+    : QObject(parent), d(std::make_unique<Private>(*this))
+{
+}
+
+FVColorPickerViewController::~FVColorPickerViewController() = default;
+
+FVColor FVColorPickerViewController::selectedColor() const
+{
+    return d->selectedColor;
+}
+
+void FVColorPickerViewController::setSelectedColor(const FVColor &color)
+{
+    const bool changed = color != d->selectedColor;
+    d->selectedColor = color;
+    // An equal color is sent too: the picker may be in the middle of a pick that this one ends.
+    d->picker.setSelectedColor(favrin::host::toPlatformColor(color));
+    if (changed)
+        Q_EMIT selectedColorChanged();
+}
+
+QSizeF FVColorPickerViewController::preferredContentSize() const
+{
+    return d->preferredContentSize;
+}
+
+bool FVColorPickerViewController::wantsMaterial() const
+{
+    return d->wantsMaterial;
+}
+
+FVColorPickerViewController::State FVColorPickerViewController::state() const
+{
+    return static_cast<State>(d->picker.state());
+}
+
+void FVColorPickerViewController::present(QQuickWindow *window)
+{
+    if (window)
+        d->picker.present(PresentationStyle::Presented, *window->contentItem());
+}
+
+void FVColorPickerViewController::presentPopover(QQuickItem *anchor)
+{
+    if (anchor && anchor->window())
+        d->picker.present(PresentationStyle::Popover, *anchor);
+}
+
+void FVColorPickerViewController::embed(QQuickItem *container)
+{
+    if (container && container->window())
+        d->picker.present(PresentationStyle::Embedded, *container);
+}
+
+void FVColorPickerViewController::dismiss()
+{
+    d->picker.dismiss();
+}
+
+QQuickItem *FVColorPickerViewController::view() const
+{
+    return d->picker.view();
+}
+
+void FVColorPickerViewController::startServiceAhead()
+{
+    favrin::host::ServiceAhead::instance().start(RemotePicker().traits());
+}
+
+QString FVColorPickerViewController::servicePath()
+{
+    return favrin::host::ServiceProcess::program();
+}

@@ -1,0 +1,26 @@
+#pragma once
+
+#include "host/fvcolorpickerviewcontroller.h"
+#include "host/remotepicker.h"
+
+class FVColorPickerViewController::Private
+{
+public:
+    explicit Private(FVColorPickerViewController &controller);
+
+    favrin::host::RemotePicker picker;
+    FVColor selectedColor;
+    QList<FVColor> suggestedColors;
+    QSizeF preferredContentSize;
+    bool wantsMaterial = false;
+
+    /** Stores @p value through @p field of the wishes; false when it is there already. */
+    template<class Field, class Value>
+    bool store(Field field, const Value &value)
+    {
+        if (field(picker.wishes()) == value)
+            return false;
+        picker.change([&](favrin::host::PickerWishes &wishes) { field(wishes) = value; });
+        return true;
+    }
+};

@@ -1,0 +1,125 @@
+#include "host/presentation.h"
+
+#include "host/presentationpanel.h"
+#include "host/presentationscrim.h"
+#include "host/remoteviewitem.h"
+
+#include <QPropertyAnimation>
+#include <QQuickWindow>
+
+namespace favrin::host {
+
+namespace {
+
+/** Above whatever an app stacks; popups of Qt Quick Controls use a million. */
+constexpr double stackingOrder = 2'000'000;
+constexpr int revealMilliseconds = 160;
+
+} // namespace
+
+Presentation::Presentation(PresentationStyle style, QQuickItem &place, QObject *parent)
+    : QObject(parent)
+    , m_style(style)
+    , m_place(&place)
+    , m_parentItem(style == PresentationStyle::Embedded ? &place : place.window()->contentItem())
+    , m_focusBefore(place.window() ? place.window()->activeFocusItem() : nullptr)
+{
+    build();
+    for (const auto signal : {&QQuickItem::widthChanged, &QQuickItem::heightChanged})
+        connect(m_parentItem, signal, this, &Presentation::layOut);
+    connect(m_place, &QObject::destroyed, this, &Presentation::placeWasLost);
+    connect(m_place, &QQuickItem::windowChanged, this, &Presentation::placeWasLost);
+    layOut();
+}
+
+Presentation::~Presentation()
+{
+    const bool hadFocus = m_view && m_view->hasActiveFocus();
+    // The view hangs below the panel, the panel beside the scrim; any of them may have gone with the window.
+    delete m_view;
+    delete m_panel;
+    delete m_scrim;
+    if (hadFocus && m_focusBefore)
+        m_focusBefore->forceActiveFocus(Qt::PopupFocusReason);
+}
+
+QQuickWindow *Presentation::window() const
+{
+    return m_parentItem ? m_parentItem->window() : nullptr;
+}
+
+void Presentation::build()
+{
+    if (m_style == PresentationStyle::Embedded) {
+        m_view = new RemoteViewItem(m_parentItem);
+        return;
+    }
+    const auto look =
+        m_style == PresentationStyle::Presented ? PresentationScrim::Look::Dimmed : PresentationScrim::Look::Clear;
+    m_scrim = new PresentationScrim(look, m_parentItem);
+    m_scrim->setZ(stackingOrder);
+    m_scrim->setOpacity(0);
+    m_panel = new PresentationPanel(m_parentItem);
+    m_panel->setZ(stackingOrder);
+    m_panel->setOpacity(0);
+    m_view = new RemoteViewItem(m_panel);
+    // A popover has no close button: leaving it is what ends it.
+    if (m_style == PresentationStyle::Popover)
+        connect(m_scrim, &PresentationScrim::pressed, this, &Presentation::dismissRequested);
+}
+
+void Presentation::layOut()
+{
+    if (!m_parentItem || !m_place || !m_view)
+        return;
+    const QSizeF window = m_parentItem->size();
+    const QRectF anchor = m_place->mapRectToItem(m_parentItem, m_place->boundingRect());
+    const auto layout = layoutPresentation(m_style, window, m_preferredContentSize, anchor);
+    if (m_style == PresentationStyle::Embedded) {
+        m_view->setSize(layout.panel.size());
+        return;
+    }
+    m_scrim->setSize(window);
+    m_panel->setLayout(layout);
+    const QRectF content = m_panel->contentRectangle();
+    m_view->setPosition(content.topLeft());
+    m_view->setSize(content.size());
+}
+
+void Presentation::setPreferredContentSize(QSizeF size)
+{
+    if (size == m_preferredContentSize)
+        return;
+    m_preferredContentSize = size;
+    layOut();
+}
+
+void Presentation::setAppearance(bool dark)
+{
+    if (m_panel)
+        m_panel->setAppearance(dark);
+}
+
+void Presentation::setMaterial(bool material)
+{
+    if (m_panel)
+        m_panel->setMaterial(material);
+}
+
+void Presentation::reveal(bool animated)
+{
+    for (QQuickItem *item : {static_cast<QQuickItem *>(m_scrim), static_cast<QQuickItem *>(m_panel)}) {
+        if (!item || item->opacity() == 1.0)
+            continue;
+        if (!animated) {
+            item->setOpacity(1);
+            continue;
+        }
+        auto *animation = new QPropertyAnimation(item, "opacity", item);
+        animation->setDuration(revealMilliseconds);
+        animation->setEndValue(1.0);
+        animation->start(QAbstractAnimation::DeleteWhenStopped);
+    }
+}
+
+} // namespace favrin::host

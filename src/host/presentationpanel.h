@@ -1,0 +1,41 @@
+#pragma once
+
+#include "host/presentationlayout.h"
+
+#include <QColor>
+#include <QQuickPaintedItem>
+
+namespace favrin::host {
+
+/** The panel behind a picker: rounded, with its arrow, shadow and material. Takes what falls on it. */
+class PresentationPanel : public QQuickPaintedItem
+{
+    Q_OBJECT
+
+public:
+    explicit PresentationPanel(QQuickItem *parent);
+
+    /** The panel's place in its parent; the item is larger by the shadow and the arrow. */
+    void setLayout(const PresentationLayout &layout);
+    void setAppearance(bool dark);
+    /** With the material the app's content shines through a little; without, the panel is opaque. */
+    void setMaterial(bool material);
+
+    /** Where the picker stands, in this item's coordinates. */
+    QRectF contentRectangle() const;
+
+    void paint(QPainter *painter) override;
+
+protected:
+    void mousePressEvent(QMouseEvent *event) override;
+    void wheelEvent(QWheelEvent *event) override;
+
+private:
+    QPainterPath outline() const;
+
+    PresentationLayout m_layout;
+    bool m_dark = false;
+    bool m_material = false;
+};
+
+} // namespace favrin::host

@@ -1,0 +1,323 @@
+#include "host/remotepicker.h"
+
+#include "host/presentation.h"
+#include "host/remoteviewitem.h"
+#include "host/remoteviewsession.h"
+#include "host/serviceahead.h"
+
+#include <QEvent>
+#include <QGuiApplication>
+#include <QInputMethod>
+#include <QPalette>
+#include <QQuickWindow>
+#include <QScreen>
+
+#include <utility>
+
+namespace favrin::host {
+
+using namespace std::chrono_literals;
+
+namespace {
+
+/** A service that was told of the end and does not confirm it is left behind. */
+constexpr auto farewellPatience = 500ms;
+
+remote::PresentationContext contextOf(PresentationStyle style)
+{
+    switch (style) {
+    case PresentationStyle::Presented:
+        return remote::PresentationContext::Presented;
+    case PresentationStyle::Popover:
+        return remote::PresentationContext::Popover;
+    case PresentationStyle::Embedded:
+        return remote::PresentationContext::Embedded;
+    }
+    return remote::PresentationContext::Unspecified;
+}
+
+std::string displayIdentifier(const QQuickWindow *window)
+{
+    const QScreen *screen = window ? window->screen() : QGuiApplication::primaryScreen();
+    if (!screen)
+        return {};
+    const auto serial = screen->serialNumber();
+    return (serial.isEmpty() ? screen->name() : screen->name() + u':' + serial).toStdString();
+}
+
+} // namespace
+
+RemotePicker::RemotePicker(QObject *parent) : QObject(parent)
+{
+    m_farewell.setSingleShot(true);
+    m_farewell.setInterval(farewellPatience);
+    connect(&m_farewell, &QTimer::timeout, this, &RemotePicker::serviceFinished);
+    // For its changes of palette, which have no signal.
+    qGuiApp->installEventFilter(this);
+    connect(qGuiApp, &QGuiApplication::layoutDirectionChanged, this, &RemotePicker::scheduleUpdate);
+}
+
+RemotePicker::~RemotePicker()
+{
+    tearDown();
+}
+
+bool RemotePicker::eventFilter(QObject *watched, QEvent *event)
+{
+    if (event->type() == QEvent::ApplicationPaletteChange)
+        scheduleUpdate();
+    return QObject::eventFilter(watched, event);
+}
+
+void RemotePicker::setState(State state)
+{
+    if (std::exchange(m_state, state) != state)
+        Q_EMIT stateChanged();
+}
+
+bool RemotePicker::isDark() const
+{
+    return traits().appearance == remote::Appearance::Dark;
+}
+
+remote::Traits RemotePicker::traits() const
+{
+    const QQuickWindow *window = m_presentation ? m_presentation->window() : nullptr;
+    remote::Traits traits;
+    traits.presentationContext =
+        m_presentation ? contextOf(m_presentation->style()) : remote::PresentationContext::Unspecified;
+    traits.appearance = m_wishes.appearance;
+    if (traits.appearance == remote::Appearance::Unspecified) {
+        const bool dark = QGuiApplication::palette().color(QPalette::Window).lightnessF() < 0.5f;
+        traits.appearance = dark ? remote::Appearance::Dark : remote::Appearance::Light;
+    }
+    const auto direction = m_wishes.layoutDirection.value_or(QGuiApplication::layoutDirection());
+    traits.layoutDirection =
+        direction == Qt::RightToLeft ? remote::LayoutDirection::RightToLeft : remote::LayoutDirection::LeftToRight;
+    traits.textSizeCategory = m_wishes.textSizeCategory;
+    traits.displayGamut = m_wishes.displayGamut;
+    traits.displayIdentifier = displayIdentifier(window);
+    traits.locale = m_wishes.locale.value_or(QLocale()).bcp47Name().toStdString();
+    traits.reduceMotion = m_wishes.reduceMotion;
+    traits.increaseContrast = m_wishes.increaseContrast;
+    return traits;
+}
+
+QSizeF RemotePicker::hostWindowSize() const
+{
+    if (m_wishes.hostWindowSize)
+        return *m_wishes.hostWindowSize;
+    const QQuickWindow *window = m_presentation ? m_presentation->window() : nullptr;
+    return window ? QSizeF(window->size()) : QSizeF(0, 0);
+}
+
+double RemotePicker::keyboardSpace() const
+{
+    if (m_wishes.keyboardSpace)
+        return *m_wishes.keyboardSpace;
+    const auto *item = view();
+    const auto *inputMethod = QGuiApplication::inputMethod();
+    if (!item || !inputMethod->isVisible())
+        return 0;
+    const QRectF keyboard = inputMethod->keyboardRectangle();
+    if (keyboard.isEmpty())
+        return 0;
+    const QRectF place = item->mapRectToScene(item->boundingRect());
+    return std::max(0.0, place.bottom() - keyboard.top());
+}
+
+RemoteViewItem *RemotePicker::view() const
+{
+    return m_presentation ? m_presentation->view() : nullptr;
+}
+
+qint64 RemotePicker::serviceProcessIdentifier() const
+{
+    return m_session ? m_session->processIdentifier() : 0;
+}
+
+void RemotePicker::present(PresentationStyle style, QQuickItem &place)
+{
+    if (isPresented())
+        return;
+    tearDown();
+    m_presentation = std::make_unique<Presentation>(style, place);
+    m_wishes.configuration.isEmbedded = style == PresentationStyle::Embedded;
+    QString error;
+    m_session = ServiceAhead::instance().take(traits(), &error);
+    setState(State::Starting);
+    if (!m_session) {
+        // Reported in a later turn, like any other end of a service.
+        QMetaObject::invokeMethod(
+            this, [this, error] { serviceEnded(error); }, Qt::QueuedConnection);
+        return;
+    }
+    connectSession();
+    connectSurroundings();
+    m_presentation->setAppearance(isDark());
+    sendUpdate();
+    if (m_selectedColorIsSet)
+        setSelectedColor(m_selectedColor);
+    m_session->server().sendPrepareForDisplay(++m_serial);
+    m_session->flush();
+}
+
+void RemotePicker::connectSession()
+{
+    auto *session = m_session.get();
+    connect(session, &RemoteViewSession::prepared, this, &RemotePicker::servicePrepared);
+    connect(session, &RemoteViewSession::frameArrived, this, &RemotePicker::serviceDrew);
+    connect(session, &RemoteViewSession::pickerDidSelectColor, this,
+            [this](const auto &color, const auto &colorspace, bool isVolatile) {
+                m_selectedColor = color;
+                m_selectedColorIsSet = true;
+                Q_EMIT picked(color, colorspace, isVolatile);
+            });
+    connect(session, &RemoteViewSession::pickerDidShowEyedropper, this, &RemotePicker::eyedropperShown);
+    connect(session, &RemoteViewSession::pickerDidFloatEyedropper, this, &RemotePicker::eyedropperFloated);
+    connect(session, &RemoteViewSession::pickerDidDismissEyedropper, this, &RemotePicker::eyedropperDismissed);
+    // The session must not go while it speaks.
+    connect(session, &RemoteViewSession::colorPickerDidFinish, this, &RemotePicker::serviceFinished,
+            Qt::QueuedConnection);
+    connect(session, &RemoteViewSession::ended, this, &RemotePicker::serviceEnded, Qt::QueuedConnection);
+    connect(session, &RemoteViewSession::preferredContentSizeDidChange, this, [this](double width, double height) {
+        m_presentation->setPreferredContentSize(QSizeF(width, height));
+        Q_EMIT preferredContentSizeChanged(QSizeF(width, height));
+    });
+    connect(session, &RemoteViewSession::backgroundEffectDidChange, this, [this](remote::BackgroundEffect effect) {
+        const bool material = effect == remote::BackgroundEffect::ThickMaterial;
+        m_presentation->setMaterial(material);
+        Q_EMIT materialChanged(material);
+    });
+}
+
+void RemotePicker::connectSurroundings()
+{
+    connect(m_presentation.get(), &Presentation::dismissRequested, this, &RemotePicker::dismiss);
+    connect(m_presentation.get(), &Presentation::placeWasLost, this, &RemotePicker::serviceFinished,
+            Qt::QueuedConnection);
+    const auto update = [this] {
+        scheduleUpdate();
+        Q_EMIT surroundingsChanged();
+    };
+    if (const auto *window = m_presentation->window()) {
+        connect(window, &QQuickWindow::widthChanged, m_presentation.get(), update);
+        connect(window, &QQuickWindow::heightChanged, m_presentation.get(), update);
+        connect(window, &QQuickWindow::screenChanged, m_presentation.get(), update);
+    }
+    const auto *inputMethod = QGuiApplication::inputMethod();
+    connect(inputMethod, &QInputMethod::keyboardRectangleChanged, m_presentation.get(), update);
+    connect(inputMethod, &QInputMethod::visibleChanged, m_presentation.get(), update);
+}
+
+void RemotePicker::scheduleUpdate()
+{
+    if (!isPresented() || !m_session || std::exchange(m_updateScheduled, true))
+        return;
+    QMetaObject::invokeMethod(this, &RemotePicker::sendUpdate, Qt::QueuedConnection);
+}
+
+void RemotePicker::sendUpdate()
+{
+    m_updateScheduled = false;
+    if (!isPresented() || !m_session || m_session->hasEnded())
+        return;
+    auto now = traits();
+    if (now != m_sentTraits) {
+        m_session->server().sendTraits(now);
+        m_sentTraits = std::move(now);
+        m_presentation->setAppearance(isDark());
+    }
+    auto configuration = m_wishes.configuration;
+    configuration.hostWindowWidth = hostWindowSize().width();
+    configuration.hostWindowHeight = hostWindowSize().height();
+    configuration.keyboardSpace = keyboardSpace();
+    if (configuration != m_sentConfiguration) {
+        m_session->server().sendConfiguration(configuration);
+        m_sentConfiguration = std::move(configuration);
+    }
+    m_session->flush();
+}
+
+void RemotePicker::setSelectedColor(const std::optional<platform::Color> &color)
+{
+    m_selectedColor = color;
+    m_selectedColorIsSet = true;
+    if (!isPresented() || !m_session || m_session->hasEnded())
+        return;
+    // A configuration that waits was asked for before this color.
+    sendUpdate();
+    const auto space = color && color->colorSpace() ? color->colorSpace()->name() : std::nullopt;
+    m_session->server().sendSelectedColor(color, space);
+    m_session->flush();
+}
+
+void RemotePicker::servicePrepared(quint32 serial)
+{
+    if (serial != m_serial || m_state != State::Starting)
+        return;
+    // The preferred size came before the answer, so the first frame has the right size already.
+    m_presentation->view()->setSession(m_session.get());
+    m_presentation->view()->forceActiveFocus(Qt::PopupFocusReason);
+    m_session->server().sendPresent();
+    m_session->flush();
+}
+
+void RemotePicker::serviceDrew()
+{
+    if (m_state != State::Starting)
+        return;
+    m_presentation->reveal(!m_wishes.reduceMotion);
+    setState(State::Ready);
+}
+
+void RemotePicker::dismiss()
+{
+    if (!isPresented())
+        return;
+    setState(State::Stopping);
+    if (m_session && !m_session->hasEnded()) {
+        m_session->server().sendColorPickerDidFinish();
+        m_session->flush();
+    }
+    m_farewell.start();
+}
+
+void RemotePicker::serviceFinished()
+{
+    if (!isPresented() && m_state != State::Stopping)
+        return;
+    tearDown();
+    setState(State::NotRunning);
+    Q_EMIT finished();
+}
+
+void RemotePicker::serviceEnded(const QString &error)
+{
+    if (m_state == State::Stopping) {
+        serviceFinished();
+        return;
+    }
+    if (!isPresented())
+        return;
+    tearDown();
+    setState(State::Failed);
+    Q_EMIT terminated(error);
+}
+
+void RemotePicker::tearDown()
+{
+    m_farewell.stop();
+    m_sentTraits.reset();
+    m_sentConfiguration.reset();
+    if (m_presentation && m_presentation->view())
+        m_presentation->view()->setSession(nullptr);
+    m_presentation.reset();
+    if (m_session) {
+        m_session->disconnect(this);
+        m_session->end();
+        m_session.release()->deleteLater();
+    }
+}
+
+} // namespace favrin::host

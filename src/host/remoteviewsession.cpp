@@ -1,0 +1,169 @@
+#include "host/remoteviewsession.h"
+
+#include "host/serviceprocess.h"
+
+#include <QSocketNotifier>
+#include <QTimer>
+
+#include <cstring>
+
+namespace favrin::host {
+
+using namespace std::chrono_literals;
+
+namespace {
+
+/** A service that lost its host leaves within milliseconds; one that does not is stuck. */
+constexpr auto timeToLeave = 1000ms;
+
+QString closeText(server::CloseReason reason, const std::string &detail)
+{
+    const auto text = QString::fromStdString(detail);
+    switch (reason) {
+    case server::CloseReason::ServiceGone:
+        return QStringLiteral("The color picker's process ended.");
+    case server::CloseReason::ProtocolError:
+        return QStringLiteral("The color picker broke a rule of the protocol: %1").arg(text);
+    case server::CloseReason::LimitExceeded:
+        return QStringLiteral("The color picker exceeded a limit: %1").arg(text);
+    }
+    return text;
+}
+
+} // namespace
+
+/** Turns the server's calls into signals of the session. */
+class RemoteViewSession::Delegate : public server::RemoteViewServerDelegate
+{
+public:
+    explicit Delegate(RemoteViewSession &session) : m_session(session) {}
+
+    void frameDidArrive(const server::Frame &frame) override
+    {
+        m_session.m_surface.update(frame);
+        Q_EMIT m_session.frameArrived();
+    }
+    void surfaceDidUnmap() override { m_session.m_surface.clear(); }
+    void serviceDidBind() override {}
+    void serviceIsReady() override
+    {
+        m_session.m_ready = true;
+        Q_EMIT m_session.ready();
+    }
+    void serviceDidPrepare(std::uint32_t serial) override { Q_EMIT m_session.prepared(serial); }
+    void pickerDidSelectColor(const std::optional<platform::Color> &color, const std::optional<std::string> &colorspace,
+                              bool isVolatile) override
+    {
+        Q_EMIT m_session.pickerDidSelectColor(color, colorspace, isVolatile);
+    }
+    void pickerDidShowEyedropper() override { Q_EMIT m_session.pickerDidShowEyedropper(); }
+    void pickerDidFloatEyedropper() override { Q_EMIT m_session.pickerDidFloatEyedropper(); }
+    void pickerDidDismissEyedropper() override { Q_EMIT m_session.pickerDidDismissEyedropper(); }
+    void colorPickerDidFinish() override { Q_EMIT m_session.colorPickerDidFinish(); }
+    void preferredContentSizeDidChange(double width, double height) override
+    {
+        Q_EMIT m_session.preferredContentSizeDidChange(width, height);
+    }
+    void backgroundEffectDidChange(remote::BackgroundEffect effect) override
+    {
+        Q_EMIT m_session.backgroundEffectDidChange(effect);
+    }
+    void textInputDidChange(const server::TextInputState &state) override
+    {
+        m_session.m_textInput = state;
+        Q_EMIT m_session.textInputDidChange();
+    }
+    void serviceDidOfferClipboard(const std::vector<std::string> &mimeTypes) override
+    {
+        Q_EMIT m_session.clipboardOffered(mimeTypes);
+    }
+    void serviceWantsClipboard(const std::string &mimeType, int descriptor) override
+    {
+        Q_EMIT m_session.clipboardWanted(mimeType, descriptor);
+    }
+    void cursorDidChange(const std::string &name) override
+    {
+        Q_EMIT m_session.cursorDidChange(QString::fromStdString(name));
+    }
+    void serviceResponsivenessDidChange(bool responsive) override
+    {
+        Q_EMIT m_session.responsivenessDidChange(responsive);
+    }
+    void connectionDidClose(server::CloseReason reason, const std::string &detail) override
+    {
+        m_session.finish(closeText(reason, detail));
+    }
+
+private:
+    RemoteViewSession &m_session;
+};
+
+RemoteViewSession::RemoteViewSession(QObject *parent)
+    : QObject(parent)
+    , m_delegate(std::make_unique<Delegate>(*this))
+    , m_server(std::make_unique<server::RemoteViewServer>(*m_delegate))
+    , m_process(std::make_unique<ServiceProcess>())
+{
+    m_clock.start();
+}
+
+RemoteViewSession::~RemoteViewSession()
+{
+    end();
+}
+
+QString RemoteViewSession::start()
+{
+    const int socket = m_server->openConnection();
+    if (socket < 0)
+        return QStringLiteral("No connection could be made: %1").arg(QString::fromLocal8Bit(std::strerror(errno)));
+    m_notifier = std::make_unique<QSocketNotifier>(m_server->fileDescriptor(), QSocketNotifier::Read);
+    connect(m_notifier.get(), &QSocketNotifier::activated, this, &RemoteViewSession::dispatch);
+    connect(m_process.get(), &ServiceProcess::ended, this, [this](const QString &description) {
+        // What the service still said before it ended is on the socket; the end of the connection comes behind it.
+        dispatch();
+        finish(QStringLiteral("The color picker's process ended: %1.").arg(description));
+    });
+    return m_process->start(socket);
+}
+
+void RemoteViewSession::end()
+{
+    if (!std::exchange(m_ended, true))
+        m_server->closeConnection();
+    m_notifier.reset();
+    if (m_process->processIdentifier() == 0)
+        return;
+    // The process object stays behind to reap what leaves, and to end what does not.
+    auto *process = std::exchange(m_process, std::make_unique<ServiceProcess>()).release();
+    process->disconnect(this);
+    connect(process, &ServiceProcess::ended, process, &QObject::deleteLater);
+    QTimer::singleShot(timeToLeave, process, &ServiceProcess::kill);
+}
+
+qint64 RemoteViewSession::processIdentifier() const
+{
+    return m_process->processIdentifier();
+}
+
+void RemoteViewSession::dispatch()
+{
+    if (m_ended)
+        return;
+    m_server->dispatch();
+    m_server->flush();
+}
+
+void RemoteViewSession::finish(const QString &error)
+{
+    if (m_ended)
+        return;
+    m_ended = true;
+    if (m_notifier)
+        m_notifier->setEnabled(false);
+    // Disconnected for its faults, it may still be running.
+    m_process->kill();
+    Q_EMIT ended(error);
+}
+
+} // namespace favrin::host

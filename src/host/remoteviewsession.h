@@ -1,0 +1,88 @@
+#pragma once
+
+#include "host/remotesurface.h"
+#include "host/server/remoteviewserver.h"
+
+#include <QElapsedTimer>
+#include <QObject>
+
+#include <memory>
+
+class QSocketNotifier;
+
+namespace favrin::host {
+
+class ServiceProcess;
+
+/**
+ * One picker process and the server it talks to: starts it, keeps its surface, and turns what it says into signals.
+ *
+ * The session has ended when ended() was sent; it is then of no more use. A session is abandoned by end(): nothing more
+ * comes from it, the connection closes, and a process that has not left after a second is killed. GUI thread.
+ */
+class RemoteViewSession : public QObject
+{
+    Q_OBJECT
+
+public:
+    explicit RemoteViewSession(QObject *parent = nullptr);
+    ~RemoteViewSession() override;
+
+    /** Starts the process. An error text when that fails, else empty. */
+    QString start();
+    /** Closes the connection; no signal follows. */
+    void end();
+    bool hasEnded() const { return m_ended; }
+    /** The service has built its views. */
+    bool isReady() const { return m_ready; }
+    /** For those who must find the process, e.g. a test that kills it; 0 when it does not run. */
+    qint64 processIdentifier() const;
+
+    RemoteSurface &surface() { return m_surface; }
+    /** Messages and input go to the server directly; call flush() behind them. */
+    server::RemoteViewServer &server() { return *m_server; }
+    void flush() { m_server->flush(); }
+    /** Milliseconds on the clock that input events to the service use. */
+    std::uint32_t now() const { return static_cast<std::uint32_t>(m_clock.elapsed()); }
+
+    const server::TextInputState &textInput() const { return m_textInput; }
+
+Q_SIGNALS:
+    void ready();
+    void prepared(quint32 serial);
+    /** The first and every further frame; the surface holds it already. */
+    void frameArrived();
+    void pickerDidSelectColor(const std::optional<favrin::platform::Color> &color,
+                              const std::optional<std::string> &colorspace, bool isVolatile);
+    void pickerDidShowEyedropper();
+    void pickerDidFloatEyedropper();
+    void pickerDidDismissEyedropper();
+    void colorPickerDidFinish();
+    void preferredContentSizeDidChange(double width, double height);
+    void backgroundEffectDidChange(favrin::remote::BackgroundEffect effect);
+    void textInputDidChange();
+    void clipboardOffered(const std::vector<std::string> &mimeTypes);
+    void clipboardWanted(const std::string &mimeType, int descriptor);
+    void cursorDidChange(const QString &name);
+    void responsivenessDidChange(bool responsive);
+    /** The process ended, or it was disconnected; @p error says why. */
+    void ended(const QString &error);
+
+private:
+    class Delegate;
+
+    void dispatch();
+    void finish(const QString &error);
+
+    RemoteSurface m_surface;
+    std::unique_ptr<Delegate> m_delegate;
+    std::unique_ptr<server::RemoteViewServer> m_server;
+    std::unique_ptr<ServiceProcess> m_process;
+    std::unique_ptr<QSocketNotifier> m_notifier;
+    QElapsedTimer m_clock;
+    server::TextInputState m_textInput;
+    bool m_ready = false;
+    bool m_ended = false;
+};
+
+} // namespace favrin::host

@@ -1,0 +1,40 @@
+#pragma once
+
+#include "remote/records.h"
+
+#include <QObject>
+
+#include <memory>
+
+namespace favrin::host {
+
+class RemoteViewSession;
+
+/** Keeps at most one picker process that was started before anybody asked for it. GUI thread. */
+class ServiceAhead : public QObject
+{
+    Q_OBJECT
+
+public:
+    static ServiceAhead &instance();
+
+    /** Starts one with these traits unless one waits already. */
+    void start(const remote::Traits &traits);
+    bool isReady() const;
+    /**
+     * The waiting session, or a new one when none waits or the one that waits was built for a display of another gamut,
+     * which a process cannot change. Null with @p error when no process can be started.
+     */
+    std::unique_ptr<RemoteViewSession> take(const remote::Traits &traits, QString *error);
+
+Q_SIGNALS:
+    void ready();
+
+private:
+    ServiceAhead();
+
+    std::unique_ptr<RemoteViewSession> m_waiting;
+    remote::DisplayGamut m_gamut = remote::DisplayGamut::SRGB;
+};
+
+} // namespace favrin::host
