@@ -2,7 +2,8 @@
 #
 # A static library whose types and QML files form one QML module, compiled ahead of time. Its files live in the
 # executable under qrc:/qt/qml/Favrin/Name; the engine needs addImportPath("qrc:/qt/qml"), which Qt does by itself only
-# from 6.5 on. Types are headers with QML_ELEMENT (QML_SINGLETON, ...) listed in SOURCES.
+# from 6.5 on. Types are headers with QML_ELEMENT (QML_SINGLETON, ...) listed in SOURCES. A QML file that uses a C++ type
+# of its own module imports the module by name: up to 6.4 a file's own folder gives it the QML files only.
 #
 # MODULES names the modules of ours that this one imports or whose types it uses; they are linked and come along.
 # Both the linter (target all_qmllint) and the compiler of the QML files see them.

@@ -1,5 +1,6 @@
 import QtQuick
 import Favrin.Service
+import Favrin.Shell
 import Favrin.Theme
 
 /* The title, and the close button at its trailing end. */

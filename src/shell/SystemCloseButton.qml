@@ -1,5 +1,6 @@
 import QtQuick
 import QtQuick.Templates as T
+import Favrin.Shell
 import Favrin.Theme
 
 /* The round close button. Its touch area is larger than its face. */

@@ -25,13 +25,15 @@ ColorPickerViewFactory::ColorPickerViewFactory(QQmlEngine &engine)
 
 std::unique_ptr<QQuickItem> ColorPickerViewFactory::create(service::ColorPickerState &state)
 {
-    const QVariantMap properties = {{QStringLiteral("colorPickerState"), QVariant::fromValue(&state)}};
-    std::unique_ptr<QObject> object(m_component.createWithInitialProperties(properties));
-    auto *view = qobject_cast<QQuickItem *>(object.get());
-    if (!view) {
+    if (!m_component.isReady()) {
         qWarning("The color picker has no view: %s", qPrintable(m_component.errorString()));
         return nullptr;
     }
+    const QVariantMap properties = {{QStringLiteral("colorPickerState"), QVariant::fromValue(&state)}};
+    std::unique_ptr<QObject> object(m_component.createWithInitialProperties(properties));
+    auto *view = qobject_cast<QQuickItem *>(object.get());
+    if (!view)
+        return nullptr;
     QQmlEngine::setObjectOwnership(view, QQmlEngine::CppOwnership);
     object.release();
     return std::unique_ptr<QQuickItem>(view);

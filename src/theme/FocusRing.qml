@@ -1,4 +1,5 @@
 import QtQuick
+import Favrin.Theme
 
 /* Says where the keyboard is: a ring around its parent, some distance off so that it is no marker. */
 Rectangle {
