@@ -33,6 +33,7 @@ constexpr auto anchors = std::to_array<Anchor>({
     {ColorTerm::BluishPurple, {0.496, 0.065, -0.206}},
     {ColorTerm::Brown, {0.273, 0.052, 0.049}},
     {ColorTerm::Brown, {0.311, 0.041, 0.008}},
+    {ColorTerm::Brown, {0.390, 0.043, 0.081}},
     {ColorTerm::Brown, {0.522, 0.010, 0.090}},
     {ColorTerm::Brown, {0.566, 0.063, 0.090}},
     {ColorTerm::Cyan, {0.896, -0.136, -0.053}},

@@ -17,11 +17,14 @@ platform::ColorSpace platformColorSpace(SomeColor::ColorSpace space)
     return space == SomeColor::ColorSpace::displayP3 ? platform::ColorSpace::displayP3() : platform::ColorSpace::sRGB();
 }
 
+// The display is asked only when the color's own space does not decide.
 SomeColor::ColorSpace spaceOrDeviceDefault(const platform::Color &platformColor)
 {
-    if (!platformColor.colorSpace())
-        return deviceDefaultColorSpace();
-    return colorSpaceFromPlatformColorSpace(*platformColor.colorSpace()).value_or(deviceDefaultColorSpace());
+    if (platformColor.colorSpace()) {
+        if (const auto own = colorSpaceFromPlatformColorSpace(*platformColor.colorSpace()))
+            return *own;
+    }
+    return deviceDefaultColorSpace();
 }
 
 } // namespace
