@@ -1,0 +1,415 @@
+#include "platform/defaults/defaultslocation.h"
+#include "platform/defaults/userdefaults.h"
+
+#include <QDir>
+#include <QLoggingCategory>
+#include <QTemporaryDir>
+#include <QtTest>
+
+#include <sqlite3.h>
+#include <sys/resource.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <csignal>
+#include <fstream>
+
+using namespace favrin::platform;
+namespace fs = std::filesystem;
+
+namespace {
+
+using OptionalValue = std::optional<DefaultsValue>;
+using Prepare = std::function<void(const fs::path &)>;
+
+QByteArray contentOf(const fs::path &path)
+{
+    QFile file(QString::fromStdString(path.string()));
+    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+}
+
+void writeContent(const fs::path &path, const QByteArray &content)
+{
+    std::ofstream(path, std::ios::binary).write(content.constData(), content.size());
+}
+
+void runSql(const fs::path &path, const char *sql)
+{
+    sqlite3 *database = nullptr;
+    QCOMPARE(sqlite3_open(path.c_str(), &database), SQLITE_OK);
+    QCOMPARE(sqlite3_exec(database, sql, nullptr, nullptr, nullptr), SQLITE_OK);
+    sqlite3_close(database);
+}
+
+/** A store that was closed with one value in it. */
+QByteArray goodFile(const fs::path &path)
+{
+    UserDefaults(path).set("key", std::string("before"));
+    return contentOf(path);
+}
+
+QStringList setAside(const fs::path &path)
+{
+    const QDir folder(QString::fromStdString(path.parent_path().string()));
+    return folder.entryList({QStringLiteral("*.damaged-*")}, QDir::AllEntries | QDir::System | QDir::Hidden);
+}
+
+/** A value as a test datum: the recursive variant itself has no metatype. */
+struct Sample
+{
+    DefaultsValue value;
+};
+
+Sample nested(int depth)
+{
+    DefaultsValue value = std::string("leaf");
+    for (int level = 0; level < depth; ++level)
+        value = DefaultsArray{value};
+    return {value};
+}
+
+} // namespace
+
+Q_DECLARE_METATYPE(Sample)
+Q_DECLARE_METATYPE(Prepare)
+
+/** What the store keeps, and what becomes of it when the file is not as it should be. */
+class UserDefaultsTest : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void init()
+    {
+        QLoggingCategory::setFilterRules(QStringLiteral("*.UserDefaults.warning=false"));
+        m_folder = std::make_unique<QTemporaryDir>();
+        m_file = fs::path(m_folder->path().toStdString()) / "a" / "b" / "defaults.sqlite";
+    }
+
+    void valuesComeBackFromTheDisk_data()
+    {
+        QTest::addColumn<Sample>("sample");
+        QTest::addRow("bytes") << Sample{DefaultsValue(Bytes{0, 255, 0})};
+        QTest::addRow("no bytes") << Sample{DefaultsValue(Bytes{})};
+        QTest::addRow("text") << Sample{DefaultsValue(std::string("Grid \xC3\xA9\0 end", 11))};
+        QTest::addRow("no text") << Sample{DefaultsValue(std::string())};
+        QTest::addRow("array") << Sample{
+            DefaultsValue(DefaultsArray{Bytes{1}, std::string("x"), DefaultsArray{Bytes{}}})};
+        QTest::addRow("empty array") << Sample{DefaultsValue(DefaultsArray{})};
+        QTest::addRow("deep") << nested(15);
+        QTest::addRow("large") << Sample{DefaultsValue(Bytes(4 << 20, 7))};
+    }
+    void valuesComeBackFromTheDisk()
+    {
+        QFETCH(const Sample, sample);
+        const auto &value = sample.value;
+        QVERIFY(UserDefaults(m_file).set("key", value));
+        UserDefaults defaults(m_file);
+        QVERIFY(defaults.value("key") == value);
+        QCOMPARE(defaults.bytes("key").has_value(), std::holds_alternative<Bytes>(value));
+        QCOMPARE(defaults.string("key").has_value(), std::holds_alternative<std::string>(value));
+        QCOMPARE(defaults.array("key").has_value(), std::holds_alternative<DefaultsArray>(value));
+        QVERIFY(!defaults.value("Key"));
+        QVERIFY(defaults.remove("key"));
+        QVERIFY(!UserDefaults(m_file).value("key"));
+    }
+
+    void tooMuchIsRefusedAndChangesNothing_data()
+    {
+        QTest::addColumn<QByteArray>("key");
+        QTest::addColumn<Sample>("sample");
+        QTest::addRow("long key") << QByteArray(1025, 'k') << Sample{DefaultsValue(std::string("x"))};
+        QTest::addRow("large value") << QByteArray("key") << Sample{DefaultsValue(Bytes((4 << 20) + 1, 7))};
+        QTest::addRow("too deep") << QByteArray("key") << nested(16);
+    }
+    void tooMuchIsRefusedAndChangesNothing()
+    {
+        QFETCH(const QByteArray, key);
+        QFETCH(const Sample, sample);
+        const auto &value = sample.value;
+        goodFile(m_file);
+        UserDefaults defaults(m_file);
+        const std::string_view name(key.constData(), std::size_t(key.size()));
+        QVERIFY(!defaults.set(name, value));
+        QVERIFY(!defaults.update(name, [&](const OptionalValue &) { return value; }));
+        QVERIFY(defaults.string("key") == "before");
+        QVERIFY(defaults.set("other", std::string("works")));
+    }
+
+    void readingMakesNoFileAndWritingMakesAPrivateOne()
+    {
+        const mode_t previous = ::umask(0);
+        const auto restore = qScopeGuard([&] { ::umask(previous); });
+        UserDefaults defaults(m_file);
+        QVERIFY(!defaults.value("key"));
+        QVERIFY(defaults.remove("key"));
+        QVERIFY(!fs::exists(m_file.parent_path()));
+        QVERIFY(defaults.set("key", std::string("x")));
+        for (const auto &entry : fs::directory_iterator(m_file.parent_path()))
+            QCOMPARE(entry.status().permissions(), fs::perms(0600));
+        QCOMPARE(fs::status(m_file.parent_path()).permissions(), fs::perms(0700));
+        QCOMPARE(fs::status(m_file.parent_path().parent_path()).permissions(), fs::perms(0700));
+    }
+
+    void anEqualValueIsNotWrittenAgain()
+    {
+        UserDefaults defaults(m_file);
+        const auto log = fs::path(m_file.string() + "-wal");
+        QVERIFY(defaults.set("key", std::string("x")));
+        const auto before = contentOf(log);
+        QVERIFY(!before.isEmpty());
+        QVERIFY(defaults.set("key", std::string("x")));
+        QVERIFY(defaults.remove("never stored"));
+        QVERIFY(defaults.update("key", [](const OptionalValue &value) { return value; }));
+        QCOMPARE(contentOf(log), before);
+        // Text and bytes of the same content differ.
+        QVERIFY(defaults.set("key", Bytes{'x'}));
+        QVERIFY(contentOf(log) != before);
+    }
+
+    void updateSeesTheStoredValueAndMayRemoveIt()
+    {
+        UserDefaults defaults(m_file);
+        const auto append = [](const OptionalValue &value) -> OptionalValue {
+            return (value ? std::get<std::string>(*value) : std::string()) + "+";
+        };
+        QVERIFY(defaults.update("key", append));
+        QVERIFY(UserDefaults(m_file).update("key", append));
+        QVERIFY(defaults.string("key") == "++");
+        QVERIFY(defaults.update("key", [](const OptionalValue &) { return OptionalValue(); }));
+        QVERIFY(!defaults.value("key"));
+    }
+
+    void aChangeThatUsesItsStoreDoesNoHarm()
+    {
+        UserDefaults defaults(m_file);
+        QVERIFY(defaults.set("key", std::string("x")));
+        QVERIFY(defaults.update("key", [&](const OptionalValue &) -> OptionalValue {
+            [&] { QVERIFY(!defaults.set("other", std::string("y"))); }();
+            return std::string("z");
+        }));
+        QVERIFY(defaults.string("key") == "z");
+    }
+
+    void aDamagedFileIsSetAsideWhole_data()
+    {
+        QTest::addColumn<Prepare>("prepare");
+        const auto content = [](const QByteArray &bytes) {
+            return Prepare([bytes](const fs::path &path) { writeContent(path, bytes); });
+        };
+        const auto changed = [](auto change) {
+            return Prepare([change](const fs::path &path) {
+                auto bytes = goodFile(path);
+                change(bytes);
+                writeContent(path, bytes);
+            });
+        };
+        const auto sql = [](const char *text) { return Prepare([text](const fs::path &path) { runSql(path, text); }); };
+        QTest::addRow("one byte") << content("x");
+        QTest::addRow("text") << content(QByteArray(5000, 'a'));
+        QTest::addRow("zeroes") << content(QByteArray(8192, '\0'));
+        QTest::addRow("only the magic word") << content(QByteArray("SQLite format 3\0", 16));
+        QTest::addRow("ini file") << content("[General]\nFavoriteColors=@ByteArray([])\n");
+        QTest::addRow("cut in a page") << changed([](QByteArray &bytes) { bytes.truncate(bytes.size() - 1); });
+        QTest::addRow("cut at a page") << changed([](QByteArray &bytes) { bytes.truncate(4096); });
+        QTest::addRow("page size") << changed([](QByteArray &bytes) { bytes[16] = 3; });
+        QTest::addRow("only readable format") << changed([](QByteArray &bytes) { bytes[18] = 9; });
+        QTest::addRow("future format") << changed([](QByteArray &bytes) { bytes[19] = 9; });
+        QTest::addRow("table root gone") << changed(
+            [](QByteArray &bytes) { bytes.replace(4096, 4096, QByteArray(4096, 'x')); });
+        QTest::addRow("schema text") << changed([](QByteArray &bytes) { bytes.replace("CREATE", "CR3ATE"); });
+        QTest::addRow("other table") << sql("CREATE TABLE other(a)");
+        QTest::addRow("other columns") << sql("CREATE TABLE defaults(a, b)");
+        QTest::addRow("no unique key") << sql("CREATE TABLE defaults(key, type, value)");
+        QTest::addRow("a view") << sql("CREATE TABLE t(key, type, value); CREATE VIEW defaults AS SELECT * FROM t");
+        QTest::addRow("refuses our rows")
+            << sql("CREATE TABLE defaults(key TEXT PRIMARY KEY, type INTEGER CHECK(type > 99), value BLOB)");
+        QTest::addRow("huge") << Prepare([](const fs::path &path) {
+            writeContent(path, "x");
+            fs::resize_file(path, 40 << 20);
+        });
+        QTest::addRow("folder") << Prepare([](const fs::path &path) { fs::create_directory(path); });
+        QTest::addRow("pipe") << Prepare([](const fs::path &path) { ::mkfifo(path.c_str(), 0600); });
+        QTest::addRow("link to nothing") << Prepare([](const fs::path &path) { fs::create_symlink("nowhere", path); });
+        QTest::addRow("link to itself") << Prepare([](const fs::path &path) { fs::create_symlink(path, path); });
+        QTest::addRow("pipe as its log") << Prepare([](const fs::path &path) {
+            goodFile(path);
+            ::mkfifo((path.string() + "-wal").c_str(), 0600);
+        });
+    }
+    void aDamagedFileIsSetAsideWhole()
+    {
+        QFETCH(const Prepare, prepare);
+        fs::create_directories(m_file.parent_path());
+        prepare(m_file);
+        const bool plain = fs::is_regular_file(fs::symlink_status(m_file));
+        const auto before = plain ? contentOf(m_file) : QByteArray();
+        UserDefaults defaults(m_file);
+        defaults.value("key");
+        QVERIFY(defaults.set("key", std::string("after")));
+        QVERIFY(defaults.string("key") == "after");
+        QVERIFY(UserDefaults(m_file).string("key") == "after");
+        const auto aside = setAside(m_file);
+        QVERIFY2(!aside.isEmpty(), "nothing was set aside");
+        if (plain)
+            QCOMPARE(contentOf(m_file.parent_path() / aside.front().toStdString()), before);
+        QVERIFY(!fs::exists(m_file.parent_path() / "nowhere"));
+    }
+
+    void aFileCutAnywhereGivesTheValueOrNone()
+    {
+        const auto whole = goodFile(m_file);
+        for (qsizetype length = 0; length < whole.size(); length += 521) {
+            fs::remove(m_file);
+            writeContent(m_file, whole.left(length));
+            UserDefaults defaults(m_file);
+            QVERIFY2(!defaults.value("key"), QByteArray::number(length).constData());
+            QVERIFY2(defaults.set("key", std::string("after")), QByteArray::number(length).constData());
+            QCOMPARE(setAside(m_file).isEmpty(), length == 0);
+            for (const auto &name : setAside(m_file))
+                fs::remove(m_file.parent_path() / name.toStdString());
+        }
+    }
+
+    void aFileWithOneWrongByteIsStillServed()
+    {
+        const auto whole = goodFile(m_file);
+        for (qsizetype offset = 0; offset < whole.size(); offset += offset < 128 ? 7 : 601) {
+            fs::remove(m_file);
+            auto content = whole;
+            content[offset] = char(content[offset] ^ 0xA5);
+            writeContent(m_file, content);
+            UserDefaults defaults(m_file);
+            defaults.value("key");
+            QVERIFY2(defaults.set("key", std::string("after")), QByteArray::number(offset).constData());
+            QVERIFY2(UserDefaults(m_file).string("key") == "after", QByteArray::number(offset).constData());
+        }
+    }
+
+    void rowsThatAreNotOursReadAsNone_data()
+    {
+        QTest::addColumn<QByteArray>("sql");
+        QTest::addRow("unknown type") << QByteArray("UPDATE defaults SET type = 4");
+        QTest::addRow("type as text") << QByteArray("UPDATE defaults SET type = 'two'");
+        QTest::addRow("array cut short") << QByteArray("UPDATE defaults SET type = 3, value = x'01020000'");
+        QTest::addRow("array too long") << QByteArray("UPDATE defaults SET type = 3, value = x'01ffffffff00'");
+        QTest::addRow("unknown element") << QByteArray("UPDATE defaults SET type = 3, value = x'0900000000'");
+        QTest::addRow("larger than any value") << QByteArray("UPDATE defaults SET value = zeroblob(9000000)");
+    }
+    void rowsThatAreNotOursReadAsNone()
+    {
+        QFETCH(const QByteArray, sql);
+        goodFile(m_file);
+        runSql(m_file, sql.constData());
+        UserDefaults defaults(m_file);
+        QVERIFY(!defaults.value("key"));
+        QVERIFY(defaults.set("key", std::string("after")));
+        QVERIFY(UserDefaults(m_file).string("key") == "after");
+        QVERIFY(setAside(m_file).isEmpty());
+    }
+
+    void aForeignTriggerDoesNotRun()
+    {
+        goodFile(m_file);
+        runSql(m_file, "CREATE TRIGGER evil AFTER UPDATE ON defaults BEGIN DELETE FROM defaults; END");
+        QVERIFY(UserDefaults(m_file).set("key", std::string("after")));
+        QVERIFY(UserDefaults(m_file).string("key") == "after");
+    }
+
+    void worksInMemoryWhileThereIsNoFolderAndCatchesUp()
+    {
+        const auto obstacle = m_file.parent_path().parent_path();
+        writeContent(obstacle, "a file where the folder should be");
+        UserDefaults defaults(m_file);
+        QLoggingCategory::setFilterRules(QString());
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("user defaults")));
+        QTest::failOnWarning(QRegularExpression(QStringLiteral(".*")));
+        QVERIFY(!defaults.set("first", std::string("1")));
+        QVERIFY(!defaults.set("first", std::string("2")));
+        QVERIFY(!defaults.update("first", [](const OptionalValue &value) -> OptionalValue {
+            return value ? std::get<std::string>(*value) + "+" : std::string("lost");
+        }));
+        QVERIFY(defaults.string("first") == "2+");
+        fs::remove(obstacle);
+        QVERIFY(defaults.set("second", std::string("x")));
+        QVERIFY(UserDefaults(m_file).string("first") == "2+");
+    }
+
+    void aFullDiskIsReportedAndKeepsTheOldValue()
+    {
+        goodFile(m_file);
+        UserDefaults defaults(m_file);
+        QVERIFY(defaults.string("key") == "before");
+        rlimit previous;
+        QCOMPARE(::getrlimit(RLIMIT_FSIZE, &previous), 0);
+        const auto handler = std::signal(SIGXFSZ, SIG_IGN);
+        const rlimit full{9000, previous.rlim_max};
+        QCOMPARE(::setrlimit(RLIMIT_FSIZE, &full), 0);
+        const bool written = defaults.set("key", Bytes(100'000, 1));
+        QCOMPARE(::setrlimit(RLIMIT_FSIZE, &previous), 0);
+        std::signal(SIGXFSZ, handler);
+        QVERIFY(!written);
+        QVERIFY(defaults.bytes("key") == Bytes(100'000, 1));
+        QVERIFY(UserDefaults(m_file).string("key") == "before");
+        QVERIFY(defaults.set("other", std::string("x")));
+        QVERIFY(UserDefaults(m_file).bytes("key") == Bytes(100'000, 1));
+    }
+
+    void aFileTakenAwayIsNotWrittenInto()
+    {
+        UserDefaults defaults(m_file);
+        QVERIFY(defaults.set("key", std::string("x")));
+        fs::remove_all(m_file.parent_path());
+        QVERIFY(!defaults.value("key"));
+        QVERIFY(defaults.set("key", std::string("x")));
+        QVERIFY(UserDefaults(m_file).string("key") == "x");
+    }
+
+    void standardFile_data()
+    {
+        QTest::addColumn<QByteArray>("named");
+        QTest::addColumn<QByteArray>("dataHome");
+        QTest::addColumn<QByteArray>("home");
+        QTest::addColumn<QByteArray>("expected");
+        const QByteArray name = "/favrin-color-picker/defaults.sqlite";
+        QTest::addRow("named") << QByteArray("/x/y.db") << QByteArray("/data") << QByteArray("/home/u")
+                               << QByteArray("/x/y.db");
+        QTest::addRow("data home") << QByteArray() << QByteArray("/data") << QByteArray("/home/u") << "/data" + name;
+        QTest::addRow("relative data home")
+            << QByteArray() << QByteArray("data") << QByteArray("/home/u") << "/home/u/.local/share" + name;
+        QTest::addRow("home") << QByteArray() << QByteArray() << QByteArray("/home/u") << "/home/u/.local/share" + name;
+        QTest::addRow("nothing") << QByteArray() << QByteArray() << QByteArray() << QByteArray();
+    }
+    void standardFile()
+    {
+        QFETCH(const QByteArray, named);
+        QFETCH(const QByteArray, dataHome);
+        QFETCH(const QByteArray, home);
+        QFETCH(const QByteArray, expected);
+        const std::array<const char *, 3> names{"FAVRIN_DEFAULTS_FILE", "XDG_DATA_HOME", "HOME"};
+        const std::array<QByteArray, 3> previous{qgetenv(names[0]), qgetenv(names[1]), qgetenv(names[2])};
+        const std::array<QByteArray, 3> values{named, dataHome, home};
+        for (std::size_t index = 0; index < names.size(); ++index)
+            values[index].isEmpty() ? qunsetenv(names[index]) : qputenv(names[index], values[index]);
+        const auto file = standardDefaultsFile();
+        for (std::size_t index = 0; index < names.size(); ++index)
+            previous[index].isEmpty() ? qunsetenv(names[index]) : qputenv(names[index], previous[index]);
+        QCOMPARE(QByteArray::fromStdString(file.string()), expected);
+    }
+
+    void withoutAnyFileTheStoreWorksInMemory()
+    {
+        UserDefaults defaults{fs::path()};
+        QVERIFY(!defaults.set("key", std::string("x")));
+        QVERIFY(defaults.string("key") == "x");
+        QVERIFY(!defaults.remove("key"));
+        QVERIFY(!defaults.value("key"));
+    }
+
+private:
+    std::unique_ptr<QTemporaryDir> m_folder;
+    fs::path m_file;
+};
+
+QTEST_APPLESS_MAIN(UserDefaultsTest)
+#include "tst_userdefaults.moc"

@@ -1,0 +1,197 @@
+#include "platform/defaults/userdefaults.h"
+
+#include <QLoggingCategory>
+#include <QTemporaryDir>
+#include <QtTest>
+
+#include <sys/mman.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <atomic>
+#include <csignal>
+#include <random>
+
+using namespace favrin::platform;
+namespace fs = std::filesystem;
+
+namespace {
+
+using OptionalValue = std::optional<DefaultsValue>;
+
+/** A child process that runs @p work and leaves without unwinding, as a killed one would. */
+template<class Work>
+pid_t startChild(Work work)
+{
+    const pid_t child = ::fork();
+    if (child == 0) {
+        work();
+        ::_exit(0);
+    }
+    return child;
+}
+
+bool endedWell(pid_t child)
+{
+    int status = -1;
+    return ::waitpid(child, &status, 0) == child && WIFEXITED(status) && WEXITSTATUS(status) == 0;
+}
+
+/** A number that parent and children share. */
+class SharedNumber
+{
+public:
+    SharedNumber()
+        : m_page(::mmap(nullptr, sizeof(std::atomic<int>), PROT_READ | PROT_WRITE, MAP_SHARED | MAP_ANONYMOUS, -1, 0))
+    {
+    }
+    ~SharedNumber() { ::munmap(m_page, sizeof(std::atomic<int>)); }
+    SharedNumber(const SharedNumber &) = delete;
+    SharedNumber &operator=(const SharedNumber &) = delete;
+    std::atomic<int> *operator->() const { return static_cast<std::atomic<int> *>(m_page); }
+
+private:
+    void *m_page;
+};
+
+/** A value whose every byte belongs together: the number, then the number's low byte again and again. */
+std::string numbered(int number)
+{
+    return std::to_string(number) + ':' + std::string(20'000, char('a' + number % 26));
+}
+
+} // namespace
+
+/** What several processes do to one store, and what is left when they die. */
+class UserDefaultsProcessesTest : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void init()
+    {
+        QLoggingCategory::setFilterRules(QStringLiteral("*.UserDefaults.warning=false"));
+        m_folder = std::make_unique<QTemporaryDir>();
+        m_file = fs::path(m_folder->path().toStdString()) / "defaults.sqlite";
+    }
+
+    void killedAtAnyMomentLeavesTheOldOrTheNewValue()
+    {
+        // A fixed seed: the moments still differ from run to run, the spread does not.
+        std::mt19937 random(1);
+        int stored = 0;
+        for (int round = 0; round < 60; ++round) {
+            SharedNumber acknowledged;
+            acknowledged->store(stored);
+            const int first = stored + 1;
+            const pid_t writer = startChild([&] {
+                UserDefaults defaults(m_file);
+                for (int number = first;; ++number) {
+                    if (defaults.set("key", numbered(number)))
+                        acknowledged->store(number);
+                }
+            });
+            QVERIFY(QTest::qWaitFor([&] { return acknowledged->load() >= first; }));
+            ::usleep(random() % 3000);
+            ::kill(writer, SIGKILL);
+            ::waitpid(writer, nullptr, 0);
+
+            UserDefaults defaults(m_file);
+            const auto text = defaults.string("key");
+            QVERIFY(text);
+            stored = QString::fromStdString(text->substr(0, text->find(':'))).toInt();
+            QVERIFY(*text == numbered(stored));
+            // Nothing that was acknowledged is lost; at most the save in flight is there as well.
+            QVERIFY(stored == acknowledged->load() || stored == acknowledged->load() + 1);
+            QVERIFY(defaults.set("parent", std::to_string(round)));
+        }
+        QCOMPARE(std::distance(fs::directory_iterator(m_file.parent_path()), fs::directory_iterator()), 1);
+    }
+
+    void twoWritersLoseNothing()
+    {
+        constexpr int each = 200;
+        std::array<pid_t, 2> writers;
+        for (std::size_t index = 0; index < writers.size(); ++index) {
+            writers[index] = startChild([&] {
+                UserDefaults defaults(m_file);
+                for (int number = 0; number < each; ++number) {
+                    const bool written = defaults.update("list", [&](const OptionalValue &value) -> OptionalValue {
+                        auto list = value ? std::get<DefaultsArray>(*value) : DefaultsArray();
+                        list.push_back(std::to_string(index) + ' ' + std::to_string(number));
+                        return list;
+                    });
+                    if (!written)
+                        ::_exit(1);
+                }
+            });
+        }
+        for (const pid_t writer : writers)
+            QVERIFY(endedWell(writer));
+        const auto list = UserDefaults(m_file).array("list");
+        QVERIFY(list);
+        std::array<int, 2> next{};
+        for (const auto &entry : *list) {
+            const auto &text = std::get<std::string>(entry);
+            const auto writer = std::size_t(text.front() - '0');
+            QCOMPARE(QString::fromStdString(text.substr(2)).toInt(), next.at(writer)++);
+        }
+        QCOMPARE(next, (std::array{each, each}));
+    }
+
+    void manyProcessesMeetADamagedFileAndLoseNothing()
+    {
+        for (int round = 0; round < 10; ++round) {
+            fs::remove_all(m_file.parent_path());
+            fs::create_directories(m_file.parent_path());
+            QFile file(QString::fromStdString(m_file.string()));
+            QVERIFY(file.open(QIODevice::WriteOnly));
+            file.write(QByteArray(9000, 'x'));
+            file.close();
+            std::vector<pid_t> writers;
+            for (int index = 0; index < 4; ++index) {
+                writers.push_back(startChild([&] {
+                    UserDefaults defaults(m_file);
+                    if (!defaults.set("key " + std::to_string(index), std::string("x")))
+                        ::_exit(1);
+                }));
+            }
+            for (const pid_t writer : writers)
+                QVERIFY(endedWell(writer));
+            UserDefaults defaults(m_file);
+            for (std::size_t index = 0; index < writers.size(); ++index)
+                QVERIFY(defaults.string("key " + std::to_string(index)) == "x");
+        }
+    }
+
+    void aProcessThatStopsWhileItWritesDelaysButDoesNotBlock()
+    {
+        QVERIFY(UserDefaults(m_file).set("key", std::string("before")));
+        SharedNumber inside;
+        const pid_t holder = startChild([&] {
+            UserDefaults(m_file).update("key", [&](const OptionalValue &value) {
+                inside->store(1);
+                for (;;)
+                    ::pause();
+                return value;
+            });
+        });
+        QVERIFY(QTest::qWaitFor([&] { return inside->load() == 1; }));
+        UserDefaults defaults(m_file);
+        QVERIFY(defaults.string("key") == "before");
+        QVERIFY(!defaults.set("key", std::string("after")));
+        QVERIFY(defaults.string("key") == "after");
+        ::kill(holder, SIGKILL);
+        ::waitpid(holder, nullptr, 0);
+        QVERIFY(UserDefaults(m_file).string("key") == "before");
+        QVERIFY(defaults.set("key", std::string("after")));
+        QVERIFY(UserDefaults(m_file).string("key") == "after");
+    }
+
+private:
+    std::unique_ptr<QTemporaryDir> m_folder;
+    fs::path m_file;
+};
+
+QTEST_APPLESS_MAIN(UserDefaultsProcessesTest)
+#include "tst_userdefaults_processes.moc"
