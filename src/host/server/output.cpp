@@ -3,8 +3,6 @@
 #include "host/server/connection.h"
 #include "remote/limits.h"
 
-#include <algorithm>
-
 #include <wayland-server-protocol.h>
 
 namespace favrin::host::server {
@@ -32,25 +30,22 @@ const void *Output::requests()
     return &table;
 }
 
-Output::Output(Connection &connection) : m_connection(connection)
+Output::Output(Connection &connection, int scale, std::function<void()> onBound)
+    : m_connection(connection), m_scale(scale), m_onBound(std::move(onBound))
 {
     offerGlobal<&Output::bind>(connection.display(), wl_output_interface, offeredVersion, this);
 }
 
-void Output::setScale(int scale)
-{
-    scale = std::clamp(scale, 1, remote::limits::largestScale);
-    if (scale == m_scale)
-        return;
-    m_scale = scale;
-    m_resources.forEach([this](wl_resource *output) { describe(output); });
-}
-
 void Output::enter(wl_resource *surface)
 {
-    m_surface.reset(surface);
     if (m_connection.admitsEvent())
         m_resources.forEach([&](wl_resource *output) { wl_surface_send_enter(surface, output); });
+}
+
+void Output::leave(wl_resource *surface)
+{
+    if (m_connection.admitsEvent())
+        m_resources.forEach([&](wl_resource *output) { wl_surface_send_leave(surface, output); });
 }
 
 void Output::bind(wl_client *client, int version, std::uint32_t id)
@@ -59,8 +54,7 @@ void Output::bind(wl_client *client, int version, std::uint32_t id)
     if (!output)
         return;
     describe(output);
-    if (m_surface.get())
-        wl_surface_send_enter(m_surface.get(), output);
+    m_onBound();
 }
 
 void Output::describe(wl_resource *output)

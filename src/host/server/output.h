@@ -2,19 +2,26 @@
 
 #include "host/server/resource.h"
 
+#include <functional>
+
 namespace favrin::host::server {
 
 class Connection;
 
-/** wl_output: the one screen that the service sees, as large as a surface may be. It tells the scale to draw with. */
+/** wl_output: a screen as large as a surface may be, which tells the scale to draw with. */
 class Output
 {
 public:
-    explicit Output(Connection &connection);
+    Output(Connection &connection, int scale, std::function<void()> onBound);
 
-    void setScale(int scale);
-    /** Tells @p surface that it is on this screen. */
+    int scale() const { return m_scale; }
+    bool isBound() const { return !m_resources.isEmpty(); }
+    /** Only before it is bound. */
+    void setScale(int scale) { m_scale = scale; }
+
+    /** Tells the service that @p surface is on this screen, or is no longer. */
     void enter(wl_resource *surface);
+    void leave(wl_resource *surface);
 
 private:
     static const void *requests();
@@ -23,8 +30,8 @@ private:
 
     Connection &m_connection;
     ResourceList m_resources;
-    WeakResource m_surface;
-    int m_scale = 1;
+    int m_scale;
+    std::function<void()> m_onBound;
 };
 
 } // namespace favrin::host::server

@@ -3,14 +3,12 @@
 #include "host/server/clipboard.h"
 #include "host/server/compositor.h"
 #include "host/server/connection.h"
-#include "host/server/output.h"
 #include "host/server/remoteview.h"
+#include "host/server/screens.h"
 #include "host/server/seat.h"
 #include "host/server/surface.h"
 #include "host/server/textinputmanager.h"
 #include "host/server/xdgshell.h"
-
-#include <algorithm>
 
 namespace favrin::host::server {
 
@@ -71,8 +69,8 @@ struct RemoteViewServer::Private
 
     Connection connection;
     Compositor compositor{connection};
-    Output output{connection};
-    XdgShell shell{connection, output};
+    Screens screens{connection};
+    XdgShell shell{connection, screens};
     Seat seat{connection};
     TextInputManager textInput{connection};
     Clipboard clipboard{connection};
@@ -108,7 +106,7 @@ void RemoteViewServer::flush()
 
 void RemoteViewServer::configure(int width, int height, int scale)
 {
-    d->output.setScale(scale);
+    d->screens.setScale(scale);
     d->shell.configure(width, height);
 }
 

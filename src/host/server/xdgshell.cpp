@@ -1,7 +1,7 @@
 #include "host/server/xdgshell.h"
 
 #include "host/server/connection.h"
-#include "host/server/output.h"
+#include "host/server/screens.h"
 #include "host/server/surface.h"
 #include "host/server/xdgpositioner.h"
 #include "host/server/xdgsurface.h"
@@ -41,7 +41,7 @@ const void *XdgShell::requests()
     return &table;
 }
 
-XdgShell::XdgShell(Connection &connection, Output &output) : m_connection(connection), m_output(output)
+XdgShell::XdgShell(Connection &connection, Screens &screens) : m_connection(connection), m_screens(screens)
 {
     offerGlobal<&XdgShell::bind>(connection.display(), xdg_wm_base_interface, offeredVersion, this);
 }
@@ -95,7 +95,7 @@ bool XdgShell::adopt(XdgSurface &toplevel)
     if (m_toplevel)
         return false;
     m_toplevel = &toplevel;
-    m_output.enter(toplevel.surface()->handle());
+    m_screens.setSurface(toplevel.surface()->handle());
     return true;
 }
 

@@ -7,7 +7,7 @@
 namespace favrin::host::server {
 
 class Connection;
-class Output;
+class Screens;
 class Surface;
 class XdgSurface;
 
@@ -15,7 +15,7 @@ class XdgSurface;
 class XdgShell
 {
 public:
-    XdgShell(Connection &connection, Output &output);
+    XdgShell(Connection &connection, Screens &screens);
 
     /** Points. */
     void configure(int width, int height);
@@ -47,7 +47,7 @@ private:
     void setMapped(Surface *surface);
 
     Connection &m_connection;
-    Output &m_output;
+    Screens &m_screens;
     ResourceList m_resources;
     XdgSurface *m_toplevel = nullptr;
     Surface *m_mapped = nullptr;
