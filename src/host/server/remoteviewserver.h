@@ -21,6 +21,8 @@ struct PixelRect
     int y = 0;
     int width = 0;
     int height = 0;
+
+    bool operator==(const PixelRect &) const = default;
 };
 
 /** What the service drew: premultiplied BGRA in memory (ARGB32 on a little-endian machine), origin top left. */
@@ -60,10 +62,6 @@ struct TextInputState
 
     bool operator==(const TextInputState &) const = default;
 };
-inline bool operator==(const PixelRect &a, const PixelRect &b)
-{
-    return a.x == b.x && a.y == b.y && a.width == b.width && a.height == b.height;
-}
 
 enum class CloseReason {
     /** The other end of the socket is gone: the service exited or was killed. */
@@ -74,8 +72,10 @@ enum class CloseReason {
     LimitExceeded,
 };
 
-/** What comes from the service. Called from dispatch(), on its thread. A call may destroy the server only by way of a
- * later turn. */
+/**
+ * What comes from the service. Called from dispatch() only, on its thread. A call may send and close, but may destroy
+ * the server only by way of a later turn.
+ */
 class RemoteViewServerDelegate
 {
 public:
@@ -83,13 +83,13 @@ public:
 
     /** The pixels are readable during the call only. */
     virtual void frameDidArrive(const Frame &frame) = 0;
+    /** The picker took its surface away; not called when the connection ends. */
     virtual void surfaceDidUnmap() = 0;
 
     virtual void serviceDidBind() = 0;
     virtual void serviceIsReady() = 0;
     virtual void serviceDidPrepare(std::uint32_t serial) = 0;
-    /** @p colorspace is the name that the message to the app carries, which may be missing though the color has a
-     * space. */
+    /** @p colorspace is the name that the message to the app carries; a color may have a space and come without it. */
     virtual void pickerDidSelectColor(const std::optional<platform::Color> &color,
                                       const std::optional<std::string> &colorspace, bool isVolatile) = 0;
     virtual void pickerDidShowEyedropper() = 0;
@@ -125,8 +125,13 @@ public:
  *
  * Knows no toolkit. The owner watches fileDescriptor() and calls dispatch() when it is readable; calls that send
  * something are flushed by flush(), which the owner calls before it goes back to its event loop. One thread.
- * Offered: compositor, subcompositor, shm, seat (pointer, keyboard, touch), output, xdg_wm_base (popups are dismissed
- * at once), text-input-unstable-v1, data device, favrin_remote_view_v1. Limits per client are in serverlimits.h.
+ *
+ * Offered: compositor, shm (ARGB8888 and XRGB8888), seat (pointer, keyboard, touch), output, xdg_wm_base (one toplevel;
+ * popups are dismissed at once), text-input-unstable-v1, data device (clipboard only), favrin_remote_view_v1. Limits
+ * per client are in serverlimits.h.
+ *
+ * Nothing waits for the service and nothing piles up: of what it does not read, motion is held back and the newest is
+ * sent later; what must arrive is sent until the socket is full, which ends the connection.
  */
 class RemoteViewServer
 {
@@ -143,7 +148,9 @@ public:
     int openConnection();
 
     int fileDescriptor() const;
+    /** Handles at most 4,096 bytes of requests and tells the delegate; of the frames among them only the newest. */
     void dispatch();
+    /** Sends what waits. What goes wrong here makes fileDescriptor() readable and is told by the next dispatch(). */
     void flush();
 
     // Surface.
@@ -152,7 +159,9 @@ public:
     /** Tells the service that its last frame is on screen; it draws the next one only after this. */
     void frameWasShown(std::uint32_t milliseconds);
 
-    // Messages to the service; see the protocol. Lists and texts beyond the limits are cut, which the log says.
+    // Messages to the service; see the protocol. Lists and texts beyond the limits are cut, which serverDidWarn() says.
+    // Until the service has bound the extension, and while it does not read, the newest of each kind waits; then they
+    // go out as traits, configuration, color, prepare, present, finish.
     void sendTraits(const remote::Traits &traits);
     void sendConfiguration(const remote::Configuration &configuration);
     void sendSelectedColor(const std::optional<platform::Color> &color, const std::optional<std::string> &colorspace);
@@ -166,23 +175,29 @@ public:
     void pointerMotion(std::uint32_t time, double x, double y);
     /** @p button is the evdev code (BTN_LEFT is 0x110). */
     void pointerButton(std::uint32_t time, std::uint32_t button, bool pressed);
-    /** Scrolling in points; whole wheel clicks in @p discrete (0 for a touchpad). Positive is down or right. */
+    /**
+     * Scrolling in points; whole wheel clicks in @p discrete (0 for a touchpad). Positive is down or right. All zero
+     * ends the scrolling of a touchpad.
+     */
     void pointerAxis(std::uint32_t time, double horizontal, double vertical, int horizontalDiscrete,
                      int verticalDiscrete);
+    /** Ends a group of events that belong together; flush() does it, too. */
     void pointerFrame();
 
     void touchDown(std::uint32_t time, int id, double x, double y);
     void touchMotion(std::uint32_t time, int id, double x, double y);
     void touchUp(std::uint32_t time, int id);
+    /** As pointerFrame(). */
     void touchFrame();
     void touchCancel();
 
-    /** The host's keymap as an XKB text; an empty text selects the default keymap. */
+    /** The host's keymap as an XKB text, empty for the default keymap. A text that is no keymap changes nothing. */
     void setKeymap(const std::string &keymap);
     /** Layout names ("us", "de") for a host that cannot give its keymap. */
     void setKeymapFromNames(const std::string &rules, const std::string &model, const std::string &layout,
                             const std::string &variant, const std::string &options);
     void setRepeat(int keysPerSecond, int delayMilliseconds);
+    /** The picker has the host's keyboard focus; its window counts as active. */
     void keyboardEnter();
     void keyboardLeave();
     /** @p key is the evdev code (the X11 code less 8). */
@@ -204,18 +219,21 @@ public:
     void deleteSurroundingText(std::uint32_t before, std::uint32_t after);
 
     // Clipboard.
-    /** The host's clipboard offers these types (at most 32 are passed on); empty when it holds nothing of use. */
+    /**
+     * The host's clipboard offers these types (at most 32 are passed on); empty when it holds nothing of use. It takes
+     * the place of what the service has offered, so do not call it for the service's own content.
+     */
     void setClipboard(const std::vector<std::string> &mimeTypes);
     /** Asks the service's clipboard for a type: the service writes it to @p descriptor, which is closed here. */
     void requestServiceClipboard(const std::string &mimeType, int descriptor);
 
     // Watchdog.
-    /** Pings the service; an answer or its absence is told by serviceResponsivenessDidChange(). */
+    /** Pings the service, or, if the last ping was not answered yet, tells serviceResponsivenessDidChange(false). */
     void ping();
 
     /** The service's surface is on screen or not. */
     bool isMapped() const;
-    /** Ends the connection at once. */
+    /** Ends the connection at once. No delegate call follows, not even connectionDidClose(). */
     void closeConnection();
 
 private:
