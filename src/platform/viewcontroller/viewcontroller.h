@@ -1,7 +1,10 @@
 #pragma once
 
+#include "platform/viewcontroller/viewcontrollerregistry.h"
+
 #include <QObject>
 #include <QPointer>
+#include <QQuickItem>
 #include <QSizeF>
 
 #include <functional>
@@ -9,8 +12,6 @@
 #include <optional>
 #include <string>
 #include <vector>
-
-class QQuickItem;
 
 namespace favrin::platform {
 
@@ -29,24 +30,28 @@ struct TraitCollection
 };
 
 /**
- * A thin controller of one view, a Qt Quick item: parent and child, traits, layout passes, appearance, preferred content
- * size. Main thread only. A child controller is owned by its parent; a view is owned by its controller.
+ * A thin controller of one view, a Qt Quick item: parent and child, traits, layout passes, appearance, preferred
+ * content size. Main thread only. A child controller is owned by its parent; a view is owned by its controller and must
+ * have no owner among the QObjects. Say setAppeared(false) before destroying a controller that is on screen.
  */
 class ViewController : public QObject
 {
     Q_OBJECT
 
 public:
+    /** Children are destroyed first; they have no parent any more then. */
     ~ViewController() override;
 
     /** The view, loaded on first use (loadView(), then viewDidLoad()). */
     QQuickItem *view();
-    QQuickItem *viewIfLoaded() const;
+    QQuickItem *viewIfLoaded() const { return m_view; }
 
     ViewController *parentController() const { return m_parent; }
     const std::vector<std::unique_ptr<ViewController>> &childControllers() const { return m_children; }
-    /** Takes the child and hands it this controller's traits. The caller places its view and calls didMoveToParent(). */
+    /** Takes the child and hands it this controller's traits. The caller places its view and calls didMoveToParent().
+     */
     ViewController *addChild(std::unique_ptr<ViewController> child);
+    /** A child that joins a parent on screen appears. Overrides call this one too. */
     virtual void didMoveToParent(ViewController *parent);
 
     const TraitCollection &traits() const { return m_traits; }
@@ -58,15 +63,26 @@ public:
 
     /** Points; 0 × 0 at first. */
     QSizeF preferredContentSize() const { return m_preferredContentSize; }
+    /** Sizes that are negative or not finite change nothing. */
     void setPreferredContentSize(QSizeF size);
 
-    /** Says that the view is on screen, or no longer; children hear it too. Saying it twice does nothing. */
+    /**
+     * Says that the view, which is loaded for it, is on screen, or no longer; children hear of an appearance after this
+     * controller and of a disappearance before it. Saying it twice does nothing.
+     */
     void setAppeared(bool appeared);
     bool hasAppeared() const { return m_appeared; }
 
-    /** Asks for a layout pass before the next frame. Any number of requests make one pass. */
+    /**
+     * Asks for a layout pass on the main thread before the next frame of the view's window; any number of requests make
+     * one pass. Loading the view and every change of its size or implicit size ask as well. A request made during a
+     * pass makes one more pass at once; one made during that pass waits for the next frame.
+     */
     void setNeedsLayout();
-    /** Runs the layout pass now: this controller, then its children. */
+    /**
+     * Runs the layout pass now: this controller, then those of its children that need one. Does nothing before the view
+     * is loaded, and is a request like any other during a pass.
+     */
     void layoutNow();
 
 Q_SIGNALS:
@@ -88,23 +104,18 @@ protected:
 private:
     void deliverTraits(const TraitCollection &traits);
     void watchView();
+    void runLayoutPass();
 
     ViewController *m_parent = nullptr;
     std::vector<std::unique_ptr<ViewController>> m_children;
-    std::unique_ptr<QQuickItem> m_view;
+    QPointer<QQuickItem> m_view;
+    QPointer<QQuickItem> m_layoutItem;
     TraitCollection m_traits;
     bool m_traitsDelivered = false;
-    QSizeF m_preferredContentSize;
+    QSizeF m_preferredContentSize{0.0, 0.0};
     bool m_appeared = false;
     bool m_layoutPending = false;
+    bool m_inLayoutPass = false;
 };
-
-/** Makes controllers by their registered class name, so that one side can create another that it knows only by messages. */
-namespace viewcontrollerregistry {
-using Factory = std::function<std::unique_ptr<ViewController>()>;
-void registerClass(const std::string &className, Factory factory);
-/** None for a name that nobody registered. */
-std::unique_ptr<ViewController> create(const std::string &className);
-} // namespace viewcontrollerregistry
 
 } // namespace favrin::platform

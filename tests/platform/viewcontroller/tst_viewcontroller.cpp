@@ -1,0 +1,337 @@
+#include "platform/viewcontroller/viewcontroller.h"
+
+#include <QQuickWindow>
+#include <QSignalSpy>
+#include <QtTest>
+
+using namespace favrin::platform;
+
+namespace {
+
+/** Writes down what it hears. */
+class Controller : public ViewController
+{
+public:
+    Controller(QString name, QStringList &log) : m_name(std::move(name)), m_log(log) {}
+
+    std::function<void(Controller &)> onLoad;
+    std::function<void(Controller &)> onLayout;
+    int passes = 0;
+
+protected:
+    std::unique_ptr<QQuickItem> loadView() override
+    {
+        note("load");
+        auto item = std::make_unique<QQuickItem>();
+        item->setSize({100, 100});
+        return item;
+    }
+    void viewDidLoad() override
+    {
+        note("loaded");
+        if (onLoad)
+            onLoad(*this);
+    }
+    void viewWillAppear() override { note("appear"); }
+    void viewDidDisappear() override { note("disappear"); }
+    void viewWillLayoutSubviews() override { note("will layout"); }
+    void viewDidLayoutSubviews() override
+    {
+        note("did layout");
+        ++passes;
+        if (onLayout)
+            onLayout(*this);
+    }
+    void traitsDidChange(const std::optional<TraitCollection> &previous) override
+    {
+        note(!previous ? "first traits" : "traits");
+    }
+
+private:
+    void note(const char *what) { m_log << m_name + u' ' + QString::fromLatin1(what); }
+
+    QString m_name;
+    QStringList &m_log;
+};
+
+} // namespace
+
+/** What controllers hear, in which order, and when they lay out. */
+class ViewControllerTest : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void init()
+    {
+        m_window = std::make_unique<QQuickWindow>();
+        m_window->resize(300, 300);
+        m_parent = std::make_unique<Controller>(QStringLiteral("p"), m_log);
+        m_child = nullptr;
+        m_log.clear();
+    }
+    void cleanup()
+    {
+        m_parent.reset();
+        m_window.reset();
+    }
+
+    void viewIsLoadedOnce()
+    {
+        QVERIFY(!m_parent->viewIfLoaded());
+        QQuickItem *view = m_parent->view();
+        QCOMPARE(m_parent->view(), view);
+        QCOMPARE(takeLog(), QStringLiteral("p load, p loaded"));
+    }
+
+    void appearance_data()
+    {
+        QTest::addColumn<bool>("appearedBefore");
+        QTest::addColumn<QString>("heard");
+        QTest::addRow("child first") << false
+                                     << QStringLiteral("p load, p loaded, c load, c loaded, p appear, c appear");
+        QTest::addRow("child joins later")
+            << true << QStringLiteral("p load, p loaded, p appear, c load, c loaded, c appear");
+    }
+    void appearance()
+    {
+        QFETCH(const bool, appearedBefore);
+        QFETCH(const QString, heard);
+        m_parent->setAppeared(appearedBefore);
+        m_parent->view();
+        join();
+        m_parent->setAppeared(true);
+        m_parent->setAppeared(true);
+        QCOMPARE(takeLog(), heard);
+        QVERIFY(m_child->hasAppeared());
+        m_parent->setAppeared(false);
+        m_parent->setAppeared(false);
+        QCOMPARE(takeLog(), QStringLiteral("c disappear, p disappear"));
+    }
+
+    void traitsReachWhoeverHasOthers()
+    {
+        const TraitCollection popover{PresentationContext::Popover, UserInterfaceStyle::Dark};
+        join();
+        takeLog();
+        m_parent->setTraits(m_parent->traits());
+        QCOMPARE(takeLog(), QStringLiteral("p first traits, c first traits"));
+        m_parent->setTraits(popover);
+        m_parent->setTraits(popover);
+        QCOMPARE(takeLog(), QStringLiteral("p traits, c traits"));
+        auto late = std::make_unique<Controller>(QStringLiteral("l"), m_log);
+        QVERIFY(m_parent->addChild(std::move(late))->traits() == popover);
+        QCOMPARE(takeLog(), QStringLiteral("l first traits"));
+    }
+
+    void preferredContentSize_data()
+    {
+        QTest::addColumn<QSizeF>("size");
+        QTest::addColumn<int>("announcements");
+        QTest::addRow("same") << QSizeF(360, 500) << 0;
+        QTest::addRow("hardly another") << QSizeF(360, 500 + 1e-13) << 1;
+        QTest::addRow("none") << QSizeF(0, 0) << 1;
+        QTest::addRow("negative") << QSizeF(-1, 5) << 0;
+        QTest::addRow("endless") << QSizeF(qInf(), 5) << 0;
+        QTest::addRow("not a number") << QSizeF(5, qQNaN()) << 0;
+    }
+    void preferredContentSize()
+    {
+        QFETCH(const QSizeF, size);
+        QFETCH(const int, announcements);
+        m_parent->setPreferredContentSize({360, 500});
+        const QSignalSpy spy(m_parent.get(), &ViewController::preferredContentSizeChanged);
+        m_parent->setPreferredContentSize(size);
+        QCOMPARE(spy.count(), announcements);
+        QCOMPARE(m_parent->preferredContentSize(), announcements ? size : QSizeF(360, 500));
+    }
+
+    void whatCausesAPass_data()
+    {
+        using Cause = std::function<void(Controller &)>;
+        QTest::addColumn<Cause>("cause");
+        QTest::addColumn<int>("passes");
+        QTest::addRow("nothing") << Cause([](Controller &) {}) << 0;
+        QTest::addRow("many requests") << Cause([](Controller &controller) {
+            for (int count = 0; count < 10; ++count)
+                controller.setNeedsLayout();
+        }) << 1;
+        QTest::addRow("another size") << Cause([](Controller &controller) {
+            controller.view()->setSize({50, 60});
+        }) << 1;
+        QTest::addRow("the same size") << Cause([](Controller &controller) {
+            controller.view()->setSize({100, 100});
+        }) << 0;
+        QTest::addRow("implicit size") << Cause([](Controller &controller) { controller.view()->setImplicitHeight(9); })
+                                       << 1;
+        QTest::addRow("request and at once") << Cause([](Controller &controller) {
+            controller.setNeedsLayout();
+            controller.layoutNow();
+        }) << 1;
+    }
+    void whatCausesAPass()
+    {
+        QFETCH(const std::function<void(Controller &)>, cause);
+        QFETCH(const int, passes);
+        show();
+        m_parent->passes = 0;
+        cause(*m_parent);
+        waitForFrames(2);
+        QCOMPARE(m_parent->passes, passes);
+    }
+
+    void passRunsOnTheMainThreadBeforeTheFrame()
+    {
+        show();
+        m_parent->passes = 0;
+        int passesAtSync = -1;
+        QThread *thread = nullptr;
+        m_parent->onLayout = [&](Controller &) { thread = QThread::currentThread(); };
+        connect(
+            m_window.get(), &QQuickWindow::beforeSynchronizing, this,
+            [&] {
+                if (passesAtSync < 0)
+                    passesAtSync = m_parent->passes;
+            },
+            Qt::DirectConnection);
+        m_parent->setNeedsLayout();
+        QTRY_COMPARE(passesAtSync, 1);
+        QCOMPARE(thread, qApp->thread());
+    }
+
+    void requestsDuringAPass_data()
+    {
+        QTest::addColumn<int>("requests");
+        QTest::addColumn<int>("passesAtOnce");
+        QTest::addColumn<int>("passesInAll");
+        QTest::addRow("none") << 0 << 1 << 1;
+        QTest::addRow("one") << 1 << 2 << 2;
+        QTest::addRow("two") << 2 << 2 << 3;
+        QTest::addRow("many") << 9 << 2 << 10;
+    }
+    void requestsDuringAPass()
+    {
+        QFETCH(int, requests);
+        QFETCH(const int, passesAtOnce);
+        QFETCH(const int, passesInAll);
+        show();
+        m_parent->passes = 0;
+        m_parent->onLayout = [&](Controller &controller) {
+            if (requests-- <= 0)
+                return;
+            controller.setNeedsLayout();
+            controller.layoutNow();
+        };
+        m_parent->layoutNow();
+        QCOMPARE(m_parent->passes, passesAtOnce);
+        QTRY_COMPARE(m_parent->passes, passesInAll);
+        waitForFrames(2);
+        QCOMPARE(m_parent->passes, passesInAll);
+    }
+
+    void aControllerThatNeverRestsLeavesTheEventLoopAlive()
+    {
+        show();
+        m_parent->onLayout = [](Controller &controller) { controller.setNeedsLayout(); };
+        bool alive = false;
+        m_parent->setNeedsLayout();
+        waitForFrames(3);
+        QMetaObject::invokeMethod(
+            this, [&] { alive = true; }, Qt::QueuedConnection);
+        QTRY_VERIFY(alive);
+    }
+
+    void childrenFollowTheirParentInOnePass()
+    {
+        show();
+        join();
+        m_child->view()->setParentItem(m_parent->view());
+        waitForFrames(2);
+        takeLog();
+        m_parent->onLayout = [this](Controller &) { m_child->view()->setSize({10, 10}); };
+        m_parent->layoutNow();
+        QCOMPARE(takeLog(), QStringLiteral("p will layout, p did layout, c will layout, c did layout"));
+        m_child->setNeedsLayout();
+        waitForFrames(2);
+        QCOMPARE(takeLog(), QStringLiteral("c will layout, c did layout"));
+    }
+
+    void aViewOutsideAnyWindowWaits()
+    {
+        m_parent->setNeedsLayout();
+        m_parent->layoutNow();
+        QCOMPARE(m_parent->passes, 0);
+        m_parent->view();
+        QCoreApplication::processEvents();
+        QCOMPARE(m_parent->passes, 0);
+        show();
+        QCOMPARE(m_parent->passes, 1);
+    }
+
+    void childrenGoBeforeTheViewAndWithoutAParent()
+    {
+        struct Leaving : Controller
+        {
+            using Controller::Controller;
+            ~Leaving() override { *hadParent = parentController() != nullptr; }
+            bool *hadParent = nullptr;
+        };
+        bool hadParent = true;
+        auto child = std::make_unique<Leaving>(QStringLiteral("c"), m_log);
+        child->hadParent = &hadParent;
+        const QPointer<QQuickItem> childView = child->view();
+        childView->setParentItem(m_parent->view());
+        m_parent->addChild(std::move(child));
+        m_parent.reset();
+        QVERIFY(!hadParent);
+        QVERIFY(!childView);
+    }
+
+    void registryMakesWhatWasRegistered()
+    {
+        using namespace viewcontrollerregistry;
+        QVERIFY(!create("_Name"));
+        registerClass("_Name", [this] { return std::make_unique<Controller>(QStringLiteral("r"), m_log); });
+        const auto first = create("_Name");
+        const auto second = create("_Name");
+        QVERIFY(dynamic_cast<Controller *>(first.get()));
+        QVERIFY(second && second != first);
+        QVERIFY(!create("_name"));
+        registerClass("_Name", {});
+        QVERIFY(!create("_Name"));
+    }
+
+private:
+    void join()
+    {
+        auto child = std::make_unique<Controller>(QStringLiteral("c"), m_log);
+        m_child = child.get();
+        m_parent->addChild(std::move(child));
+        m_child->view();
+        m_child->didMoveToParent(m_parent.get());
+    }
+    void show()
+    {
+        m_parent->view()->setParentItem(m_window->contentItem());
+        m_window->show();
+        QVERIFY(QTest::qWaitForWindowExposed(m_window.get()));
+        waitForFrames(2);
+    }
+    void waitForFrames(int count)
+    {
+        for (int frame = 0; frame < count; ++frame) {
+            QSignalSpy spy(m_window.get(), &QQuickWindow::frameSwapped);
+            m_window->update();
+            QVERIFY(spy.wait());
+        }
+    }
+    QString takeLog() { return std::exchange(m_log, {}).join(QStringLiteral(", ")); }
+
+    std::unique_ptr<QQuickWindow> m_window;
+    std::unique_ptr<Controller> m_parent;
+    Controller *m_child = nullptr;
+    QStringList m_log;
+};
+
+QTEST_MAIN(ViewControllerTest)
+#include "tst_viewcontroller.moc"
