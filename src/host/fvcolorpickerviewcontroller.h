@@ -7,12 +7,11 @@
 #include <QLocale>
 #include <QObject>
 #include <QQmlEngine>
+#include <QQuickItem>
+#include <QQuickWindow>
 #include <QSizeF>
 
 #include <memory>
-
-class QQuickItem;
-class QQuickWindow;
 
 /**
  * A color picker for an app: shown inside the app's window, running in a process of its own.

@@ -11,7 +11,7 @@ public:
     favrin::host::RemotePicker picker;
     FVColor selectedColor;
     QList<FVColor> suggestedColors;
-    QSizeF preferredContentSize;
+    QSizeF preferredContentSize = QSizeF(0, 0);
     bool wantsMaterial = false;
 
     /** Stores @p value through @p field of the wishes; false when it is there already. */
