@@ -52,11 +52,11 @@ struct Traits
 struct Configuration
 {
     /** UTF-8; none selects the localized default. */
-    std::optional<std::string> title;
+    std::optional<std::string> title = std::nullopt;
     bool showsAlpha = true;
     bool allowsNoColor = false;
     bool showsEyedropper = true;
-    std::optional<std::vector<platform::Color>> suggestedColors;
+    std::optional<std::vector<platform::Color>> suggestedColors = std::nullopt;
     bool shouldUseDarkGridInDarkMode = false;
     /** 0 unspecified, 1 light, 2 dark; the service leaves its grid as it is for any other number. */
     std::int32_t userInterfaceStyleForGrid = 0;

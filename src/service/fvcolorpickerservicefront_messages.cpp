@@ -31,8 +31,9 @@ void FVColorPickerServiceFront::setConfiguration(const remote::Configuration &co
 
 void FVColorPickerServiceFront::prepareForDisplay(std::function<void()> completion)
 {
+    auto *child = loadedChild();
     updatePreferredContentSize();
-    if (auto *child = loadedChild())
+    if (child)
         child->prepareForDisplay(std::move(completion));
     else if (completion)
         completion();
