@@ -8,6 +8,7 @@
 #include <QSGTexture>
 
 #include <algorithm>
+#include <utility>
 
 namespace favrin::host {
 
@@ -29,54 +30,72 @@ RemoteSurfaceNode::RemoteSurfaceNode(QQuickWindow &window) : m_window(window) {}
 
 RemoteSurfaceNode::~RemoteSurfaceNode() = default;
 
-void RemoteSurfaceNode::rebuild(const QSize &size)
+void RemoteSurfaceNode::clear()
 {
     for (auto *strip : m_strips) {
         removeChildNode(strip);
         delete strip;
     }
     m_strips.clear();
-    m_size = size;
-    for (int top = 0; top < size.height(); top += stripHeight) {
+}
+
+void RemoteSurfaceNode::replaceTexture(const RemoteSurface &surface)
+{
+    // The software scene graph paints on this thread before the surface can change again, so it may use the memory
+    // itself; a GPU uploads later, on its own thread.
+    const bool software = m_window.rendererInterface()->graphicsApi() == QSGRendererInterface::Software;
+    const QImage image = software ? surface.image() : surface.image().copy();
+    const auto previous = std::exchange(m_texture, std::unique_ptr<QSGTexture>(m_window.createTextureFromImage(
+                                                       image, QQuickWindow::TextureHasAlphaChannel)));
+    for (auto *strip : m_strips)
+        strip->setTexture(m_texture.get());
+}
+
+void RemoteSurfaceNode::build()
+{
+    for (int index = 0; index * stripHeight < m_size.height(); ++index) {
         auto *strip = m_window.createImageNode();
         strip->setOwnsTexture(false);
+        strip->setTexture(m_texture.get());
+        place(*strip, index);
+        // Only now: the software scene graph looks at a node as soon as it is added.
         appendChildNode(strip);
         m_strips.push_back(strip);
     }
 }
 
+void RemoteSurfaceNode::place(QSGImageNode &strip, int index) const
+{
+    const QRect source = stripRectangle(m_size, index);
+    const double pointsPerPixel = m_target.height() / m_size.height();
+    strip.setSourceRect(source);
+    strip.setRect(m_target.x(), m_target.y() + source.y() * pointsPerPixel, m_target.width(),
+                  source.height() * pointsPerPixel);
+    const double pixels = m_target.width() * m_window.effectiveDevicePixelRatio();
+    strip.setFiltering(qFuzzyCompare(pixels, double(m_size.width())) ? QSGTexture::Nearest : QSGTexture::Linear);
+}
+
 void RemoteSurfaceNode::update(const RemoteSurface &surface, const QRectF &target, const QRegion &damage,
                                bool everything)
 {
-    const QSize size = surface.size();
-    const bool rebuilt = size != m_size;
-    if (rebuilt)
-        rebuild(size);
-    if (everything || !damage.isEmpty() || rebuilt) {
-        // The software scene graph paints on this thread before the surface can change again, so it may use the
-        // memory itself; a GPU uploads later, on its own thread.
-        const bool software = m_window.rendererInterface()->graphicsApi() == QSGRendererInterface::Software;
-        const QImage image = software ? surface.image() : surface.image().copy();
-        auto previous = std::move(m_texture);
-        m_texture.reset(m_window.createTextureFromImage(image, QQuickWindow::TextureHasAlphaChannel));
-        for (auto *strip : m_strips)
-            strip->setTexture(m_texture.get());
-    }
+    const bool rebuilt = surface.size() != m_size;
     const bool moved = target != m_target;
     m_target = target;
-    const double pointsPerPixel = size.height() > 0 ? target.height() / size.height() : 0.0;
+    if (rebuilt) {
+        clear();
+        m_size = surface.size();
+    }
+    if (rebuilt || everything || !damage.isEmpty())
+        replaceTexture(surface);
+    if (rebuilt) {
+        build();
+        return;
+    }
     for (int index = 0; index < static_cast<int>(m_strips.size()); ++index) {
-        const QRect source = stripRectangle(size, index);
         auto *strip = m_strips[static_cast<std::size_t>(index)];
-        if (rebuilt || moved) {
-            strip->setSourceRect(source);
-            strip->setRect(target.x(), target.y() + source.y() * pointsPerPixel, target.width(),
-                           source.height() * pointsPerPixel);
-            const bool exact =
-                qFuzzyCompare(target.width() * m_window.effectiveDevicePixelRatio(), double(size.width()));
-            strip->setFiltering(exact ? QSGTexture::Nearest : QSGTexture::Linear);
-        }
-        if (everything || rebuilt || damage.intersects(source))
+        if (moved)
+            place(*strip, index);
+        if (everything || damage.intersects(stripRectangle(m_size, index)))
             strip->markDirty(DirtyMaterial);
     }
 }

@@ -29,7 +29,10 @@ public:
     void update(const RemoteSurface &surface, const QRectF &target, const QRegion &damage, bool everything);
 
 private:
-    void rebuild(const QSize &size);
+    void clear();
+    void replaceTexture(const RemoteSurface &surface);
+    void build();
+    void place(QSGImageNode &strip, int index) const;
 
     QQuickWindow &m_window;
     std::unique_ptr<QSGTexture> m_texture;
