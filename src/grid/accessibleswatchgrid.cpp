@@ -102,10 +102,9 @@ private:
     ColorSwatchPickerView *view() const { return static_cast<ColorSwatchPickerView *>(object()); }
     static int indexOf(CellPosition cell) { return cell.row * gridDimensions().columns + cell.column; }
 
+    // This object exists only where somebody asked for it, so there is somebody to hear.
     void announceMarkedCell(std::optional<CellPosition> previous)
     {
-        if (!QAccessible::isActive())
-            return;
         const auto marked = view()->markedCell();
         for (const auto &cell : {previous, marked}) {
             if (cell)

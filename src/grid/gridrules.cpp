@@ -26,9 +26,10 @@ double squaredDistance(const SomeColor &one, const SomeColor &other)
     return r * r + g * g + b * b;
 }
 
+/** The first pixel whose middle lies in the cell: what is drawn and what is hit agree at every pixel. */
 int edgePixel(int index, int count, int extent)
 {
-    return static_cast<int>(std::lround(static_cast<double>(extent) * index / count));
+    return static_cast<int>(std::ceil(static_cast<double>(extent) * index / count - 0.5));
 }
 
 /** The first cell, in reading order, for which @p matches is true. */

@@ -1,6 +1,7 @@
 #include "shell/closeglyph.h"
 
 #include <QPainter>
+#include <QPainterPath>
 
 #include <algorithm>
 
@@ -43,9 +44,12 @@ void CloseGlyph::paint(QPainter &painter, QSize size, double)
     const double diameter = std::min(disc.width(), disc.height());
     QRectF cross(0.0, 0.0, crossExtent * diameter, crossExtent * diameter);
     cross.moveCenter(disc.center());
-    painter.setPen(QPen(m_crossColor, crossWidth * diameter, Qt::SolidLine, Qt::RoundCap));
-    painter.drawLine(cross.topLeft(), cross.bottomRight());
-    painter.drawLine(cross.topRight(), cross.bottomLeft());
+    // One path: the color may be translucent, and must not show twice where the strokes cross.
+    QPainterPath strokes(cross.topLeft());
+    strokes.lineTo(cross.bottomRight());
+    strokes.moveTo(cross.topRight());
+    strokes.lineTo(cross.bottomLeft());
+    painter.strokePath(strokes, QPen(m_crossColor, crossWidth * diameter, Qt::SolidLine, Qt::RoundCap));
 }
 
 } // namespace favrin::shell
