@@ -39,9 +39,9 @@ struct Traits
     TextSizeCategory textSizeCategory = TextSizeCategory::Large;
     DisplayGamut displayGamut = DisplayGamut::SRGB;
     /** Hardware identifier of the display that shows the picker; may be empty. */
-    std::string displayIdentifier;
+    std::string displayIdentifier = {};
     /** BCP 47; empty for the locale of the process. */
-    std::string locale;
+    std::string locale = {};
     bool reduceMotion = false;
     bool increaseContrast = false;
 

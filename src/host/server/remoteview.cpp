@@ -153,8 +153,8 @@ void RemoteView::settle()
         const ConfigurationMessages messages(*m_waiting.configuration);
         if (!m_connection.hasRoomFor(messages.bytes()))
             return;
-        m_waiting.configuration.reset();
         messages.post(m_view.get());
+        m_waiting.configuration.reset();
     }
     if (m_waiting.color && canSend()) {
         const auto sent = *std::exchange(m_waiting.color, std::nullopt);

@@ -17,7 +17,7 @@ void postTraits(wl_resource *view, const remote::Traits &traits);
 void postSelectedColor(wl_resource *view, const std::optional<platform::Color> &color,
                        const std::optional<std::string> &colorspace);
 
-/** One configuration as the row of events that it travels in. */
+/** One configuration, which must live as long, as the row of events that it travels in. */
 class ConfigurationMessages
 {
 public:
