@@ -1,19 +1,24 @@
 #include "host/presentationpanel.h"
 
+#include "platform/shapes/dropshadow.h"
+
 #include <QMouseEvent>
 #include <QPainter>
 #include <QPainterPath>
 #include <QWheelEvent>
+
+#include <array>
+#include <cmath>
 
 namespace favrin::host {
 
 namespace {
 
 /** Points around the panel that its shadow and arrow may cover. */
-constexpr double surround = 28;
-constexpr int shadowSteps = 12;
-constexpr double shadowOffset = 4;
-constexpr double shadowOpacity = 0.14;
+constexpr double surround = 44;
+constexpr double shadowRadius = 40;
+constexpr double shadowDrop = 6;
+constexpr QColor shadowColor(0, 0, 0, 64);
 constexpr double arrowHalfWidth = 13;
 /** Nothing behind the panel is blurred, so the material lets just enough through to tell that something is there. */
 constexpr double materialOpacity = 0.965;
@@ -33,6 +38,53 @@ QColor materialColor(bool dark)
 QColor edgeColor(bool dark)
 {
     return dark ? QColor(255, 255, 255, 32) : QColor(0, 0, 0, 22);
+}
+
+/** One end of the arrow's base to the other over its tip; @p halfWidth is negative where the outline runs leftwards. */
+void addArrow(QPainterPath &path, const QPointF &tip, double base, double halfWidth)
+{
+    const double blunt = std::copysign(3.0, halfWidth);
+    path.lineTo(tip.x() - halfWidth, base);
+    path.cubicTo(tip.x() - halfWidth / 2, base, tip.x() - blunt, tip.y(), tip.x(), tip.y());
+    path.cubicTo(tip.x() + blunt, tip.y(), tip.x() + halfWidth / 2, base, tip.x() + halfWidth, base);
+}
+
+/** The shadow of a small panel: its corners are those of any panel, its middle can be stretched. */
+const QImage &shadowTile()
+{
+    static const QImage tile = [] {
+        const int side = static_cast<int>(4 * shadowRadius) + 1;
+        QImage shape(side, side, QImage::Format_ARGB32_Premultiplied);
+        shape.fill(Qt::transparent);
+        QPainter painter(&shape);
+        painter.setRenderHint(QPainter::Antialiasing);
+        painter.setPen(Qt::NoPen);
+        painter.setBrush(Qt::black);
+        painter.drawRoundedRect(QRectF(shape.rect()).adjusted(shadowRadius, shadowRadius, -shadowRadius, -shadowRadius),
+                                14, 14);
+        painter.end();
+        return platform::dropShadow(shape, shadowRadius, shadowColor);
+    }();
+    return tile;
+}
+
+void paintShadow(QPainter &painter, const QRectF &panel)
+{
+    const QImage &tile = shadowTile();
+    const double half = 2 * shadowRadius;
+    const QRectF place = panel.adjusted(-shadowRadius, -shadowRadius, shadowRadius, shadowRadius);
+    const std::array<double, 4> sourceEdges = {0, half, half + 1, tile.width() * 1.0};
+    const std::array<double, 4> columns = {place.left(), place.left() + half, place.right() - half, place.right()};
+    const std::array<double, 4> rows = {place.top(), place.top() + half, place.bottom() - half, place.bottom()};
+    painter.setRenderHint(QPainter::SmoothPixmapTransform);
+    for (std::size_t row = 0; row < 3; ++row) {
+        for (std::size_t column = 0; column < 3; ++column) {
+            painter.drawImage(QRectF(QPointF(columns[column], rows[row]), QPointF(columns[column + 1], rows[row + 1])),
+                              tile,
+                              QRectF(QPointF(sourceEdges[column], sourceEdges[row]),
+                                     QPointF(sourceEdges[column + 1], sourceEdges[row + 1])));
+        }
+    }
 }
 
 } // namespace
@@ -75,51 +127,37 @@ QRectF PresentationPanel::contentRectangle() const
 
 QPainterPath PresentationPanel::outline() const
 {
-    const QRectF content = contentRectangle();
-    // Each half is rounded by itself: a sheet has square corners at the bottom.
-    QPainterPath top;
-    top.addRoundedRect(content, m_layout.topRadius, m_layout.topRadius);
-    QPainterPath bottom;
-    bottom.addRoundedRect(content, m_layout.bottomRadius, m_layout.bottomRadius);
-    QPainterPath upper;
-    upper.addRect(QRectF(content.topLeft(), QSizeF(content.width(), content.height() / 2)));
-    QPainterPath lower;
-    lower.addRect(QRectF(content.left(), content.center().y(), content.width(), content.height() / 2));
-    QPainterPath path = top.intersected(upper).united(bottom.intersected(lower));
-    if (m_layout.arrowEdge == ArrowEdge::None)
-        return path;
-    const QPointF tip = m_layout.arrowTip - m_layout.panel.topLeft() + content.topLeft();
-    const double base = m_layout.arrowEdge == ArrowEdge::Top ? content.top() : content.bottom();
-    // One point into the panel, so that no seam shows between the two.
-    const double inside = m_layout.arrowEdge == ArrowEdge::Top ? base + 1 : base - 1;
-    QPainterPath arrow;
-    arrow.moveTo(tip.x() - arrowHalfWidth, inside);
-    arrow.lineTo(tip.x() - arrowHalfWidth, base);
-    arrow.cubicTo(tip.x() - arrowHalfWidth / 2, base, tip.x() - 3, tip.y(), tip.x(), tip.y());
-    arrow.cubicTo(tip.x() + 3, tip.y(), tip.x() + arrowHalfWidth / 2, base, tip.x() + arrowHalfWidth, base);
-    arrow.lineTo(tip.x() + arrowHalfWidth, inside);
-    arrow.closeSubpath();
-    return path.united(arrow);
+    const QRectF box = contentRectangle();
+    const double top = m_layout.topRadius;
+    const double bottom = m_layout.bottomRadius;
+    const QPointF tip = m_layout.arrowTip - m_layout.panel.topLeft() + box.topLeft();
+    QPainterPath path(QPointF(box.left() + top, box.top()));
+    if (m_layout.arrowEdge == ArrowEdge::Top)
+        addArrow(path, tip, box.top(), arrowHalfWidth);
+    path.lineTo(box.right() - top, box.top());
+    path.arcTo(QRectF(box.right() - 2 * top, box.top(), 2 * top, 2 * top), 90, -90);
+    path.lineTo(box.right(), box.bottom() - bottom);
+    path.arcTo(QRectF(box.right() - 2 * bottom, box.bottom() - 2 * bottom, 2 * bottom, 2 * bottom), 0, -90);
+    if (m_layout.arrowEdge == ArrowEdge::Bottom)
+        addArrow(path, tip, box.bottom(), -arrowHalfWidth);
+    path.lineTo(box.left() + bottom, box.bottom());
+    path.arcTo(QRectF(box.left(), box.bottom() - 2 * bottom, 2 * bottom, 2 * bottom), 270, -90);
+    path.lineTo(box.left(), box.top() + top);
+    path.arcTo(QRectF(box.left(), box.top(), 2 * top, 2 * top), 180, -90);
+    path.closeSubpath();
+    return path;
 }
 
 void PresentationPanel::paint(QPainter *painter)
 {
     painter->setRenderHint(QPainter::Antialiasing);
     const QPainterPath path = outline();
-    painter->setBrush(Qt::NoBrush);
-    // The shadow: ever wider and fainter outlines, only outside of the panel, which may be translucent.
+    // Only outside of the panel, which may be translucent.
     painter->save();
     QPainterPath outside;
-    outside.addRect(boundingRect());
+    outside.addRect(QRectF(QPointF(), size()));
     painter->setClipPath(outside.subtracted(path));
-    painter->translate(0, shadowOffset);
-    for (int step = shadowSteps; step > 0; --step) {
-        QColor color(Qt::black);
-        color.setAlphaF(static_cast<float>(shadowOpacity / shadowSteps));
-        painter->setPen(
-            QPen(color, 2.0 * step * surround / (shadowSteps + 3), Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
-        painter->drawPath(path);
-    }
+    paintShadow(*painter, contentRectangle().translated(0, shadowDrop));
     painter->restore();
     painter->setPen(QPen(edgeColor(m_dark), 1));
     painter->setBrush(m_material ? materialColor(m_dark) : panelColor(m_dark));

@@ -30,6 +30,8 @@ RemoteViewItem::RemoteViewItem(QQuickItem *parent)
     // The picker's gestures are its own: nothing around it may take them over.
     setKeepMouseGrab(true);
     setKeepTouchGrab(true);
+    // The base class entered the scene before this class could hear of it.
+    followWindow(window());
 }
 
 RemoteViewItem::~RemoteViewItem()
@@ -59,8 +61,6 @@ void RemoteViewItem::setSession(RemoteViewSession *session)
         });
         connect(session, &RemoteViewSession::frameArrived, this, [this] { m_pointer->serviceDidDraw(); });
         connect(session, &RemoteViewSession::textInputDidChange, this, &RemoteViewItem::textInputDidChange);
-        connect(session, &RemoteViewSession::cursorDidChange, this,
-                [this](const QString &name) { setCursor(name.isEmpty() ? Qt::BlankCursor : Qt::ArrowCursor); });
         configureSurface();
         if (hasActiveFocus()) {
             m_keyboard->focusIn();

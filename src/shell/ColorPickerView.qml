@@ -9,12 +9,14 @@ Flickable {
     required property ColorPickerState colorPickerState
 
     readonly property real horizontalPadding: colorPickerState.useLandscapeLayout ? 20 : 16
+    readonly property real innerWidth: Math.max(contentWidth - 2 * horizontalPadding, 0)
+    readonly property real bottomPadding: colorPickerState.useLandscapeLayout ? 20 : 16
     readonly property bool fits: contentHeight <= height
 
     implicitWidth: contentWidth
     implicitHeight: contentHeight
     contentWidth: colorPickerState.size.width
-    contentHeight: stack.height
+    contentHeight: content.y + content.height + bottomPadding
     flickableDirection: Flickable.VerticalFlick
     boundsBehavior: fits ? Flickable.StopAtBounds : Flickable.DragAndOvershootBounds
     interactive: !fits
@@ -27,20 +29,21 @@ Flickable {
 
     Keys.onEscapePressed: colorPickerState.performClose()
 
-    Column {
-        id: stack
+    // Bindings, not a positioner: the height must be known before anything is shown.
+    ColorPickerNavigationBar {
+        id: bar
 
         x: root.horizontalPadding
-        width: Math.max(root.contentWidth - 2 * root.horizontalPadding, 0)
+        width: root.innerWidth
+        colorPickerState: root.colorPickerState
+    }
 
-        ColorPickerNavigationBar {
-            width: parent.width
-            colorPickerState: root.colorPickerState
-        }
+    ColorPickerContent {
+        id: content
 
-        ColorPickerContent {
-            width: parent.width
-            colorPickerState: root.colorPickerState
-        }
+        x: root.horizontalPadding
+        y: bar.height
+        width: root.innerWidth
+        colorPickerState: root.colorPickerState
     }
 }

@@ -41,6 +41,8 @@ int main(int argc, char *argv[])
     QGuiApplication application(argc, argv);
     QGuiApplication::setApplicationName(QStringLiteral("favrin-color-picker-service"));
     QGuiApplication::setDesktopFileName(QStringLiteral("favrin-color-picker"));
+    // The host shows its own pointer; loading a theme of pointers here would cost the first touch of a drag 20 ms.
+    QGuiApplication::setOverrideCursor(Qt::BlankCursor);
 
     QQmlEngine engine;
     favrin::shell::ColorPickerViewFactory views(engine);

@@ -94,11 +94,25 @@ void PickerService::build()
     m_front->view()->setParentItem(m_window->contentItem());
     connect(m_window.get(), &QQuickWindow::widthChanged, this, &PickerService::followWindowSize);
     connect(m_window.get(), &QQuickWindow::heightChanged, this, &PickerService::followWindowSize);
+    connect(m_front.get(), &service::FVColorPickerServiceFront::preferredContentSizeChanged, this,
+            &PickerService::settleBeforePresenting);
+}
+
+void PickerService::settleBeforePresenting()
+{
+    // The height of the picker depends on its width. While nothing is shown, the front takes the size it asks for, so
+    // that the host knows the right size, and the first frame has it, before anything is on screen.
+    if (m_window->isVisible() || m_front->preferredContentSize().isEmpty())
+        return;
+    m_window->resize(m_front->preferredContentSize().toSize());
+    m_front->view()->setSize(m_front->preferredContentSize());
+    m_front->layoutNow();
 }
 
 void PickerService::followWindowSize()
 {
-    m_front->view()->setSize(m_window->contentItem()->size());
+    if (m_window->isVisible())
+        m_front->view()->setSize(QSizeF(m_window->size()));
 }
 
 void PickerService::shouldPresent()
@@ -108,7 +122,6 @@ void PickerService::shouldPresent()
     m_front->reloadPersistedValues();
     m_front->setAppeared(true);
     m_window->show();
-    followWindowSize();
     m_front->view()->forceActiveFocus();
 }
 

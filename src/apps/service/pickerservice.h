@@ -38,6 +38,7 @@ private:
 
     void applySurroundings(const remote::Traits &traits);
     void build();
+    void settleBeforePresenting();
     void followWindowSize();
 
     remote::client::RemoteViewConnection m_connection;
