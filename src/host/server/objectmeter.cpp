@@ -56,7 +56,7 @@ void ObjectMeter::count(wl_resource *resource)
     tally->notify = Tally::resourceGoes;
     wl_resource_add_destroy_listener(resource, tally);
     if (++m_counts[kind] > limitOf(kind))
-        m_complaint("more than " + std::to_string(limitOf(kind)) + " objects of " + std::string(interface));
+        m_complaint("more than " + std::to_string(limitOf(kind)) + " objects, the last of " + std::string(interface));
 }
 
 } // namespace favrin::host::server

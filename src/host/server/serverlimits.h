@@ -28,8 +28,8 @@ inline constexpr std::array<ObjectLimit, 9> objects = {{
     {"wl_data_offer", 16},
     {"zwp_text_input_v1", 16},
 }};
-/** Live objects of any interface not listed above. */
-inline constexpr std::size_t objectsOfOtherKinds = 32;
+/** Live objects of all interfaces that are not listed above, together. */
+inline constexpr std::size_t objectsOfOtherKinds = 64;
 
 /** Shared memory mapped into the host: two 4K screens, five times buffered. */
 inline constexpr std::size_t sharedMemoryBytes = 384u * 1024u * 1024u;

@@ -1,0 +1,249 @@
+#include "presentedpair.h"
+
+#include "host/server/serverlimits.h"
+
+#include <array>
+#include <functional>
+
+#include <fcntl.h>
+#include <sys/socket.h>
+
+using namespace favrin::host::server;
+using Start = PresentedPair::Start;
+
+using Make = std::function<void(ScriptedService &)>;
+Q_DECLARE_METATYPE(Make)
+
+namespace {
+
+std::size_t limitOf(std::string_view interface)
+{
+    const auto found = std::ranges::find(limits::objects, interface, &limits::ObjectLimit::interface);
+    return found == limits::objects.end() ? limits::objectsOfOtherKinds : found->count;
+}
+
+void makePopup(ScriptedService &service)
+{
+    wl_surface *surface = wl_compositor_create_surface(service.compositor);
+    xdg_positioner *positioner = xdg_wm_base_create_positioner(service.shell);
+    xdg_surface *xdg = xdg_wm_base_get_xdg_surface(service.shell, surface);
+    xdg_surface_get_popup(xdg, nullptr, positioner);
+    xdg_positioner_destroy(positioner);
+}
+
+/** One Wayland request as bytes. */
+std::vector<std::uint32_t> request(std::uint32_t object, std::uint32_t opcode, std::uint32_t size,
+                                   std::vector<std::uint32_t> arguments = {})
+{
+    std::vector<std::uint32_t> words = {object, size << 16 | opcode};
+    words.insert(words.end(), arguments.begin(), arguments.end());
+    return words;
+}
+
+using Words = std::vector<std::uint32_t>;
+
+} // namespace
+
+Q_DECLARE_METATYPE(Words)
+
+class ServerLimitsTest : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void init() { m_files.remember(); }
+    void cleanup() { m_files.check(); }
+
+    void objectsAreCounted_data()
+    {
+        QTest::addColumn<std::string>("interface");
+        QTest::addColumn<int>("alreadyThere");
+        QTest::addColumn<Make>("make");
+        const auto row = [](const char *interface, int alreadyThere, Make make) {
+            QTest::newRow(interface) << std::string(interface) << alreadyThere << make;
+        };
+        row("wl_surface", 0, [](ScriptedService &s) { wl_compositor_create_surface(s.compositor); });
+        row("wl_region", 0, [](ScriptedService &s) { wl_compositor_create_region(s.compositor); });
+        row("wl_shm_pool", 0, [](ScriptedService &s) { s.makePool(4096); });
+        row("wl_buffer", 0, [](ScriptedService &s) { s.makeBuffer(2, 2, 0); });
+        row("wl_callback", 0, [](ScriptedService &s) {
+            if (!s.surface)
+                s.surface = wl_compositor_create_surface(s.compositor);
+            wl_surface_frame(s.surface);
+        });
+        row("xdg_popup", 0, makePopup);
+        row("wl_data_source", 0,
+            [](ScriptedService &s) { wl_data_device_manager_create_data_source(s.dataDeviceManager); });
+        row("zwp_text_input_v1", 1,
+            [](ScriptedService &s) { zwp_text_input_manager_v1_create_text_input(s.textInputManager); });
+        constexpr int boundAtStart = 13;
+        row("wl_pointer", boundAtStart, [](ScriptedService &s) { wl_seat_get_pointer(s.seat); });
+    }
+    void objectsAreCounted()
+    {
+        QFETCH(std::string, interface);
+        QFETCH(int, alreadyThere);
+        QFETCH(Make, make);
+        PresentedPair pair;
+        const int limit = static_cast<int>(limitOf(interface));
+        for (int i = alreadyThere; i < limit; ++i) {
+            make(pair.service);
+            pair.exchange();
+        }
+        QVERIFY(pair.delegate.closes.empty());
+        make(pair.service);
+        pair.exchange();
+        QCOMPARE(pair.protocolError(), std::string("favrin_remote_view_v1 6"));
+        QCOMPARE(pair.delegate.closes.size(), std::size_t(1));
+        QVERIFY(pair.delegate.closes[0].reason == CloseReason::LimitExceeded);
+        QVERIFY(pair.delegate.closes[0].detail.find(interface) != std::string::npos);
+    }
+
+    void objectsThatAreGoneDoNotCount()
+    {
+        PresentedPair pair;
+        for (int i = 0; i < 1000; ++i) {
+            wl_surface_destroy(wl_compositor_create_surface(pair.service.compositor));
+            wl_buffer_destroy(pair.service.makeBuffer(500, 500, 0));
+            pair.exchange();
+        }
+        QVERIFY(pair.delegate.closes.empty());
+    }
+
+    void sharedMemoryIsCountedAsLongAsItIsMapped()
+    {
+        constexpr int third = static_cast<int>(limits::sharedMemoryBytes / 3);
+        PresentedPair pair;
+        // Pools without a buffer are gone when they are destroyed; one that grew counts as large as it is.
+        for (int i = 0; i < 10; ++i) {
+            int memory = -1;
+            wl_shm_pool *pool = pair.service.makePool(4096, &memory);
+            QCOMPARE(::ftruncate(memory, third), 0);
+            ::close(memory);
+            wl_shm_pool_resize(pool, third);
+            wl_shm_pool_destroy(pool);
+            pair.exchange();
+        }
+        QVERIFY(pair.delegate.closes.empty());
+        // A buffer keeps its pool mapped.
+        wl_buffer *buffer = nullptr;
+        for (int i = 0; i < 3; ++i) {
+            wl_shm_pool *pool = pair.service.makePool(third);
+            buffer = wl_shm_pool_create_buffer(pool, 0, 1, 1, 4, WL_SHM_FORMAT_XRGB8888);
+            wl_shm_pool_destroy(pool);
+            pair.exchange();
+        }
+        QVERIFY(pair.delegate.closes.empty());
+        wl_buffer_destroy(buffer);
+        pair.service.makePool(third);
+        pair.exchange();
+        QVERIFY(pair.delegate.closes.empty());
+        pair.service.makePool(4096);
+        pair.exchange();
+        QCOMPARE(pair.protocolError(), std::string("favrin_remote_view_v1 6"));
+    }
+
+    void typesOfOneClipboardOfferAreCounted()
+    {
+        PresentedPair pair;
+        wl_data_source *source = wl_data_device_manager_create_data_source(pair.service.dataDeviceManager);
+        for (std::size_t i = 0; i < limits::mimeTypes; ++i)
+            wl_data_source_offer(source, ("type/" + std::to_string(i)).c_str());
+        wl_data_source_offer(source, "type/0");
+        pair.exchange();
+        QVERIFY(pair.delegate.closes.empty());
+        wl_data_source_offer(source, "one/more");
+        pair.exchange();
+        QVERIFY(pair.delegate.closes.at(0).reason == CloseReason::LimitExceeded);
+    }
+
+    void preparationsOfTheHostAreCounted()
+    {
+        PresentedPair pair;
+        for (std::uint32_t serial = 0; serial < 1000; ++serial)
+            pair.server.sendPrepareForDisplay(serial);
+        pair.exchange();
+        QCOMPARE(pair.service.eventsOf("prepare").size(), limits::openPreparations);
+        QVERIFY(!pair.delegate.warnings.empty());
+    }
+
+    void malformedBytesEndTheConnection_data()
+    {
+        QTest::addColumn<Words>("words");
+        QTest::addColumn<std::string>("detail");
+        QTest::newRow("unknown object") << request(77, 0, 8) << std::string("wl_display error 0");
+        QTest::newRow("unknown request") << request(1, 9, 8) << std::string("wl_display error 1");
+        QTest::newRow("argument missing") << request(1, 1, 8) << std::string("wl_display error 1");
+        QTest::newRow("null where an object must be") << request(1, 1, 12, {0}) << std::string("wl_display error");
+        QTest::newRow("id of the server") << request(1, 1, 12, {0xff000000}) << std::string("wl_display error");
+        QTest::newRow("id with a gap") << request(1, 1, 12, {99}) << std::string("wl_display error");
+        QTest::newRow("size of zero") << request(1, 1, 0) << std::string("wl_display error 1");
+        Words tooLong = request(1, 1, 65532);
+        tooLong.resize(4096);
+        QTest::newRow("larger than a message may be") << tooLong << std::string();
+    }
+    void malformedBytesEndTheConnection()
+    {
+        QFETCH(Words, words);
+        QFETCH(std::string, detail);
+        RecordingDelegate delegate;
+        RemoteViewServer server(delegate);
+        const int descriptor = server.openConnection();
+        ::fcntl(descriptor, F_SETFL, O_NONBLOCK);
+        static_cast<void>(!::write(descriptor, words.data(), words.size() * 4));
+        for (int i = 0; i < 8; ++i)
+            server.dispatch();
+        ::close(descriptor);
+        QCOMPARE(delegate.closes.size(), std::size_t(1));
+        QVERIFY(delegate.closes[0].reason == CloseReason::ProtocolError);
+        QVERIFY2(delegate.closes[0].detail.starts_with(detail), delegate.closes[0].detail.c_str());
+    }
+
+    void halfAMessageAndStrayFilesAreHarmless()
+    {
+        RecordingDelegate delegate;
+        RemoteViewServer server(delegate);
+        const int descriptor = server.openConnection();
+        // Six of eight bytes, and a file that no request asks for.
+        std::array<char, 6> half = {1, 0, 0, 0, 0, 0};
+        iovec data = {half.data(), half.size()};
+        alignas(cmsghdr) std::array<char, CMSG_SPACE(sizeof(int))> control = {};
+        msghdr message = {};
+        message.msg_iov = &data;
+        message.msg_iovlen = 1;
+        message.msg_control = control.data();
+        message.msg_controllen = control.size();
+        cmsghdr *header = CMSG_FIRSTHDR(&message);
+        header->cmsg_level = SOL_SOCKET;
+        header->cmsg_type = SCM_RIGHTS;
+        header->cmsg_len = CMSG_LEN(sizeof(int));
+        std::memcpy(CMSG_DATA(header), &descriptor, sizeof descriptor);
+        QCOMPARE(::sendmsg(descriptor, &message, 0), ssize_t(6));
+        server.dispatch();
+        server.dispatch();
+        QVERIFY(delegate.closes.empty());
+        ::close(descriptor);
+    }
+
+    void aFloodIsTakenInSmallPortions()
+    {
+        PresentedPair pair(Start::Mapped);
+        // Requests go through a socket that takes some hundred KiB; one turn must not try to empty it.
+        const int before = static_cast<int>(pair.delegate.calls.size());
+        for (int i = 0; i < 2000; ++i)
+            favrin_remote_view_v1_set_background_effect(pair.service.view, 1);
+        pair.service.flush();
+        pair.server.dispatch();
+        const int handled = static_cast<int>(pair.delegate.calls.size()) - before;
+        QVERIFY(handled > 0);
+        QVERIFY2(handled <= 4096 / 12, std::to_string(handled).c_str());
+        pair.exchange();
+        QCOMPARE(static_cast<int>(pair.delegate.calls.size()) - before, 2000);
+    }
+
+private:
+    OpenFiles m_files;
+};
+
+QTEST_GUILESS_MAIN(ServerLimitsTest)
+#include "tst_serverlimits.moc"
