@@ -1,0 +1,62 @@
+#pragma once
+
+#include "apps/gallery/fingertip.h"
+#include "apps/gallery/gallery.h"
+#include "apps/gallery/pickrecorder.h"
+#include "apps/gallery/tour.h"
+
+#include <QElapsedTimer>
+#include <QImage>
+#include <QProcess>
+#include <QSize>
+
+namespace favrin::gallery {
+
+/** What the tour does: touches the window like a person would, and leaves a picture of everything worth seeing. */
+class TourScript : public QObject
+{
+    Q_OBJECT
+
+public:
+    /** @param folder exists and takes the pictures and picks.jsonl */
+    TourScript(QQuickWindow *window, Gallery *gallery, const QString &folder, Tour *tour);
+
+    /** Every presentation in every appearance, with picks, and the window in other sizes and at a larger scale. */
+    void addEverything();
+    /** The one picture that needs a process of its own, started with another scale factor. */
+    void addScaledPicture();
+
+private:
+    enum class Appearance { Light, Dark };
+    enum class Direction { LeftToRight, RightToLeft };
+
+    void addSurroundings(Appearance appearance, Direction direction, QSize windowSize);
+    void addPresentation(const QString &button, const QString &picture);
+    void addTap(const QString &text, const QString &itemName, Tour::Condition isDone);
+    void addDrag();
+    void addPicture(const QString &name);
+    void addDismissal();
+    void addScaledProcess();
+
+    QQuickItem *item(const QString &name) const;
+    void tap(const QString &itemName);
+    /** Where the picker shows its colors, in points of the window. */
+    QRectF colors() const;
+    QPointF colorAt(double x, double y) const;
+    bool isStill();
+
+    QQuickWindow *m_window;
+    Gallery *m_gallery;
+    QString m_folder;
+    Tour *m_tour;
+    Fingertip m_finger;
+    PickRecorder *m_recorder = nullptr;
+    QProcess m_scaledProcess;
+
+    QRectF m_colors;
+    int m_picksBefore = 0;
+    QImage m_lastGrab;
+    QElapsedTimer m_sinceGrab;
+};
+
+} // namespace favrin::gallery
