@@ -122,7 +122,9 @@ void PickerService::shouldPresent()
     m_front->reloadPersistedValues();
     m_front->setAppeared(true);
     m_window->show();
-    m_front->view()->forceActiveFocus();
+    // Keys go to the picker's root view, which passes Tab on and ends the presentation on Escape.
+    if (auto *picker = m_front->childViewController())
+        picker->view()->forceActiveFocus();
 }
 
 } // namespace favrin::apps

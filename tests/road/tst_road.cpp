@@ -1,0 +1,347 @@
+#include "roadhost.h"
+
+#include <QGuiApplication>
+#include <QProcess>
+#include <QTemporaryDir>
+
+#include <limits>
+
+using State = FVColorPickerViewController::State;
+
+/** From the app to the picker's process and back, all of it real: only the display is missing. */
+class RoadTest : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void initTestCase();
+    void cleanup();
+
+    void aTouchDragGivesVolatilePicksAndOneFinal();
+    void aMouseDragThatLeavesThePickerGoesOn();
+    void theHostsColorComesBackBitForBitAndIsNotEchoed_data();
+    void theHostsColorComesBackBitForBitAndIsNotEchoed();
+    void keysPickFinalColors();
+    void theUserEndsThePresentation_data();
+    void theUserEndsThePresentation();
+    void theAppEndsThePresentation();
+    void anEmbeddedPickerFillsItsContainer();
+    void aKilledServiceIsReportedAndPresentingAgainWorks();
+    void aServiceThatCannotRunIsReported_data();
+    void aServiceThatCannotRunIsReported();
+    void theHostsDeathEndsTheService();
+    void aServiceStartedAheadIsTheOneThatIsShown();
+    void anAbsurdRecordLeavesASanePicker();
+    void theWindowMayGoWhileThePickerIsShown();
+
+private:
+    QTemporaryDir m_data;
+    const QPointingDevice *m_touchScreen = QTest::createTouchDevice();
+};
+
+void RoadTest::initTestCase()
+{
+    // The service's user defaults are its own here.
+    QVERIFY(m_data.isValid());
+    qputenv("FAVRIN_DEFAULTS_FILE", (m_data.path() + QStringLiteral("/defaults.sqlite")).toUtf8());
+    QVERIFY2(QFileInfo(FVColorPickerViewController::servicePath()).isExecutable(),
+             qPrintable(FVColorPickerViewController::servicePath()));
+}
+
+void RoadTest::cleanup()
+{
+    qunsetenv("FAVRIN_COLOR_PICKER_SERVICE");
+    // Whatever a test presented has left before the next one starts.
+    QTRY_VERIFY(servicesOf(getpid()).empty());
+}
+
+void RoadTest::aTouchDragGivesVolatilePicksAndOneFinal()
+{
+    RoadHost host;
+    host.picker.setSelectedColor(FVColor(0.25, 0.5, 0.75, 0.5));
+    host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+
+    auto touch = QTest::touchEvent(&host.window, const_cast<QPointingDevice *>(m_touchScreen), false);
+    touch.press(0, host.swatch(3, 5)).commit();
+    QTRY_VERIFY(!host.picks.empty());
+    for (int column = 6; column < 10; ++column) {
+        touch.move(0, host.swatch(3, column)).commit();
+        // Each step arrives: the host merges only what the service has not taken in yet.
+        const auto wanted = host.picks.size();
+        QTRY_VERIFY(host.picks.size() > wanted);
+    }
+    touch.release(0, host.swatch(4, 10)).commit();
+    QTRY_VERIFY(!host.picks.back().isVolatile);
+
+    for (std::size_t i = 0; i + 1 < host.picks.size(); ++i)
+        QVERIFY2(host.picks[i].isVolatile, qPrintable(QString::number(i)));
+    const auto &last = host.picks.back();
+    QCOMPARE(last.color, FVColor(0xC3 / 255.0, 0xD1 / 255.0, 0x17 / 255.0, 0.5));
+    QCOMPARE(last.space, FVColor::sRGBName());
+    // The color before the final one is the same: lifting adds nothing.
+    QCOMPARE(host.picks[host.picks.size() - 2].color, last.color);
+    QCOMPARE(host.picker.selectedColor(), last.color);
+}
+
+void RoadTest::aMouseDragThatLeavesThePickerGoesOn()
+{
+    RoadHost host;
+    host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+    QTest::mousePress(&host.window, Qt::LeftButton, {}, host.swatch(9, 11));
+    QTest::mouseMove(&host.window, QPoint(host.window.width() - 2, host.swatch(0, 0).y()));
+    QTest::mouseRelease(&host.window, Qt::LeftButton, {}, QPoint(host.window.width() - 2, 2));
+    QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+    QCOMPARE(host.picks.back().color, FVColor(0, 0, 0));
+}
+
+void RoadTest::theHostsColorComesBackBitForBitAndIsNotEchoed_data()
+{
+    QTest::addColumn<FVColor>("color");
+    QTest::newRow("sRGB, odd bits") << FVColor(0.1 + 0.2, 1.0 / 3.0, 5e-324, 0.123456789012345678);
+    QTest::newRow("Display P3") << FVColor(0.9999999999999999, 0.2, 0.7, 1, FVColor::displayP3Name());
+    QTest::newRow("fully transparent") << FVColor(1, 1, 1, 0);
+}
+
+void RoadTest::theHostsColorComesBackBitForBitAndIsNotEchoed()
+{
+    QFETCH(FVColor, color);
+    RoadHost host;
+    host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+    host.picker.setSelectedColor(FVColor(0.5, 0.5, 0.5));
+    host.picker.setSelectedColor(color);
+
+    // The first thing a press reports is that the color there is has become volatile: the host's own, untouched. Had
+    // the host's colors been echoed, they would stand before it.
+    QTest::mousePress(&host.window, Qt::LeftButton, {}, host.swatch(5, 5));
+    QTRY_VERIFY(host.picks.size() >= 2);
+    QCOMPARE(host.picks[0].color, color);
+    QVERIFY(host.picks[0].isVolatile);
+    QCOMPARE(host.picks[0].space, color.colorSpace());
+    QTest::mouseRelease(&host.window, Qt::LeftButton, {}, host.swatch(5, 5));
+    QTRY_VERIFY(!host.picks.back().isVolatile);
+    QCOMPARE(host.picks.back().color.colorSpace(), color.colorSpace());
+    QCOMPARE(host.picks.back().color.alpha(), color.alpha());
+}
+
+void RoadTest::keysPickFinalColors()
+{
+    RoadHost host;
+    host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+    QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.swatch(0, 0));
+    QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+    const auto before = host.picks.size();
+
+    QTest::keyClick(&host.window, Qt::Key_Right);
+    QTRY_COMPARE(host.picks.size(), before + 1);
+    QCOMPARE(host.picks.back().color, FVColor(0xEB / 255.0, 0xEB / 255.0, 0xEB / 255.0));
+    QTest::keyClick(&host.window, Qt::Key_Down);
+    QTRY_COMPARE(host.picks.size(), before + 2);
+    QCOMPARE(host.picks.back().color, FVColor(0x01 / 255.0, 0x1D / 255.0, 0x57 / 255.0));
+    QVERIFY(!host.picks.back().isVolatile);
+}
+
+void RoadTest::theUserEndsThePresentation_data()
+{
+    QTest::addColumn<QString>("how");
+    QTest::newRow("close button") << QStringLiteral("close");
+    QTest::newRow("Escape") << QStringLiteral("escape");
+    QTest::newRow("click beside a popover") << QStringLiteral("popover");
+}
+
+void RoadTest::theUserEndsThePresentation()
+{
+    QFETCH(QString, how);
+    RoadHost host;
+    QQuickItem anchor(host.window.contentItem());
+    anchor.setPosition(QPointF(20, 20));
+    anchor.setSize(QSizeF(80, 30));
+    QSignalSpy finished(&host.picker, &FVColorPickerViewController::colorPickerDidFinish);
+    if (how == u"popover")
+        host.picker.presentPopover(&anchor);
+    else
+        host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+    if (how == u"close")
+        QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.closeButton());
+    else if (how == u"escape")
+        QTest::keyClick(&host.window, Qt::Key_Escape);
+    else
+        QTest::mouseClick(&host.window, Qt::LeftButton, {}, QPoint(host.window.width() - 5, host.window.height() - 5));
+    QTRY_COMPARE(finished.size(), 1);
+    QCOMPARE(host.picker.state(), State::NotRunning);
+    QVERIFY(!host.picker.view());
+}
+
+void RoadTest::theAppEndsThePresentation()
+{
+    RoadHost host;
+    QSignalSpy finished(&host.picker, &FVColorPickerViewController::colorPickerDidFinish);
+    host.picker.present(&host.window);
+    // Even before anything is shown.
+    host.picker.dismiss();
+    QCOMPARE(host.picker.state(), State::Stopping);
+    QTRY_COMPARE(finished.size(), 1);
+    host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+    host.picker.dismiss();
+    QTRY_COMPARE(finished.size(), 2);
+    QVERIFY(host.picks.empty());
+}
+
+void RoadTest::anEmbeddedPickerFillsItsContainer()
+{
+    RoadHost host;
+    QQuickItem container(host.window.contentItem());
+    container.setPosition(QPointF(30, 40));
+    container.setSize(QSizeF(360, 500));
+    host.picker.embed(&container);
+    QTRY_VERIFY(host.isReady());
+    QCOMPARE(host.picker.view()->size(), container.size());
+    QVERIFY(!host.picker.wantsMaterial());
+    QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.swatch(0, 11));
+    QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+    QCOMPARE(host.picks.back().color, FVColor(0, 0, 0));
+    container.setSize(QSizeF(420, 500));
+    QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.swatch(0, 0));
+    QTRY_COMPARE(host.picks.back().color, FVColor(1, 1, 1));
+}
+
+void RoadTest::aKilledServiceIsReportedAndPresentingAgainWorks()
+{
+    RoadHost host;
+    QSignalSpy terminated(&host.picker, &FVColorPickerViewController::colorPickerViewServiceDidTerminateWithError);
+    QSignalSpy finished(&host.picker, &FVColorPickerViewController::colorPickerDidFinish);
+    for (int round = 1; round <= 3; ++round) {
+        host.picks.clear();
+        host.picker.present(&host.window);
+        QTRY_VERIFY(host.isReady());
+        QTest::mousePress(&host.window, Qt::LeftButton, {}, host.swatch(2, 2));
+        QTRY_VERIFY(!host.picks.empty());
+        const auto services = servicesOf(getpid());
+        QCOMPARE(services.size(), std::size_t(1));
+        kill(services[0], SIGKILL);
+        QTest::mouseMove(&host.window, host.swatch(5, 5));
+        QTRY_COMPARE(terminated.size(), round);
+        QCOMPARE(host.picker.state(), State::Failed);
+        QVERIFY(!terminated.back().at(0).toString().isEmpty());
+        QVERIFY(!host.picker.view());
+        QTest::mouseRelease(&host.window, Qt::LeftButton, {}, QPoint(5, 5));
+    }
+    QVERIFY(finished.isEmpty());
+}
+
+void RoadTest::aServiceThatCannotRunIsReported_data()
+{
+    QTest::addColumn<QByteArray>("program");
+    QTest::newRow("missing") << QByteArray("/nonexistent/service");
+    QTest::newRow("ends at once") << QByteArray("/bin/true");
+    QTest::newRow("no program") << QByteArray("/etc/passwd");
+}
+
+void RoadTest::aServiceThatCannotRunIsReported()
+{
+    QFETCH(QByteArray, program);
+    qputenv("FAVRIN_COLOR_PICKER_SERVICE", program);
+    RoadHost host;
+    QSignalSpy terminated(&host.picker, &FVColorPickerViewController::colorPickerViewServiceDidTerminateWithError);
+    host.picker.present(&host.window);
+    QTRY_COMPARE(terminated.size(), 1);
+    QCOMPARE(host.picker.state(), State::Failed);
+}
+
+void RoadTest::theHostsDeathEndsTheService()
+{
+    QProcess host;
+    host.start(QCoreApplication::applicationFilePath(), {QStringLiteral("--host")});
+    QVERIFY(host.waitForStarted());
+    const auto parent = static_cast<pid_t>(host.processId());
+    QByteArray output;
+    QTRY_VERIFY((output += host.readAllStandardOutput()).contains("ready"));
+    const auto services = servicesOf(parent);
+    QCOMPARE(services.size(), std::size_t(1));
+    host.kill();
+    QVERIFY(host.waitForFinished());
+    QTRY_VERIFY(!QFileInfo::exists(QStringLiteral("/proc/%1/exe").arg(services[0])));
+}
+
+void RoadTest::aServiceStartedAheadIsTheOneThatIsShown()
+{
+    FVColorPickerViewController::startServiceAhead();
+    FVColorPickerViewController::startServiceAhead();
+    QTRY_COMPARE(servicesOf(getpid()).size(), std::size_t(1));
+    const auto ahead = servicesOf(getpid());
+    RoadHost host;
+    host.picker.setSelectedColor(FVColor(1, 1, 1));
+    host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+    QCOMPARE(servicesOf(getpid()), ahead);
+    QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.swatch(0, 11));
+    QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+    QCOMPARE(host.picks.back().color, FVColor(0, 0, 0));
+}
+
+void RoadTest::anAbsurdRecordLeavesASanePicker()
+{
+    RoadHost host;
+    host.picker.setTitle(QString(100'000, QChar(u'ä')));
+    host.picker.setHostWindowSize(QSizeF(std::numeric_limits<double>::quiet_NaN(), -1e308));
+    host.picker.setKeyboardSpace(std::numeric_limits<double>::infinity());
+    host.picker.setSuggestedColors(QList<FVColor>(5000, FVColor(-1e300, 2, 1e300, -7)));
+    host.picker.setGridAppearance(static_cast<FVColorPickerViewController::Appearance>(77));
+    host.picker.setTextSizeCategory(static_cast<FVColorPickerViewController::TextSizeCategory>(-5));
+    host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+    // Sane again, it works as ever.
+    host.picker.setKeyboardSpace(0);
+    host.picker.resetHostWindowSize();
+    QTRY_COMPARE(host.picker.preferredContentSize().width(), 568.0);
+    QTRY_COMPARE(host.picker.view()->width(), 568.0);
+    QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.swatch(0, 11));
+    QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+    QCOMPARE(host.picks.back().color, FVColor(0, 0, 0));
+}
+
+void RoadTest::theWindowMayGoWhileThePickerIsShown()
+{
+    FVColorPickerViewController picker;
+    QSignalSpy finished(&picker, &FVColorPickerViewController::colorPickerDidFinish);
+    auto window = std::make_unique<QQuickWindow>();
+    window->resize(600, 600);
+    window->show();
+    picker.present(window.get());
+    QTRY_COMPARE(picker.state(), State::Ready);
+    window.reset();
+    QTRY_COMPARE(finished.size(), 1);
+    QCOMPARE(picker.state(), State::NotRunning);
+}
+
+/** What the test kills: a host that presents and waits. */
+int runAsHost(int argc, char *argv[])
+{
+    QGuiApplication application(argc, argv);
+    RoadHost host;
+    QObject::connect(&host.picker, &FVColorPickerViewController::stateChanged, &host.window, [&host] {
+        if (host.isReady()) {
+            std::puts("ready");
+            std::fflush(stdout);
+        }
+    });
+    host.picker.present(&host.window);
+    return QGuiApplication::exec();
+}
+
+int main(int argc, char *argv[])
+{
+    QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
+    if (argc > 1 && qstrcmp(argv[1], "--host") == 0)
+        return runAsHost(argc, argv);
+    QGuiApplication application(argc, argv);
+    RoadTest test;
+    return QTest::qExec(&test, argc, argv);
+}
+
+#include "tst_road.moc"
