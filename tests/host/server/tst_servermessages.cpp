@@ -214,7 +214,7 @@ private Q_SLOTS:
             wl_registry_bind(s.registry, s.globals["favrin_remote_view_v1"].first, &favrin_remote_view_v1_interface, 1);
         });
         row("second bind after a goodbye", "favrin_remote_view_v1 4", [](ScriptedService &s) {
-            favrin_remote_view_v1_destroy(s.view);
+            favrin_remote_view_v1_destroy(std::exchange(s.view, nullptr));
             wl_registry_bind(s.registry, s.globals["favrin_remote_view_v1"].first, &favrin_remote_view_v1_interface, 1);
         });
         row("version that is not offered", "wl_registry 0",
@@ -265,7 +265,8 @@ private Q_SLOTS:
         pair.service.events.clear();
         misuse(pair.service);
         // What comes after a wrong request is not heard any more.
-        favrin_remote_view_v1_color_picker_did_finish(pair.service.view);
+        if (pair.service.view)
+            favrin_remote_view_v1_color_picker_did_finish(pair.service.view);
         pair.exchange();
         QCOMPARE(pair.protocolError(), error);
         QCOMPARE(pair.delegate.closes.size(), std::size_t(1));
