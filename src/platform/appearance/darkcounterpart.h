@@ -7,11 +7,13 @@ namespace favrin::platform {
 enum class Appearance { Light, Dark };
 
 /**
- * The counterpart of a picker color in another appearance: a pure function, usable on any thread.
+ * The counterpart of a color in another appearance: a pure function, usable on any thread.
  *
- * From light to dark the color keeps its hue and stays recognisable, and keeps its contrast against a dark background
- * where it had contrast against a light one. Any other pair of appearances returns the color unchanged. The result is
- * in sRGB with the alpha of @p color.
+ * From light to dark a color stays recognisable: hue and order of lightness are kept, black and white are what they
+ * are, grays stay neutral. Deep colors rise above a dark background, pale tints come down a little so that their hue
+ * shows. Colors that are easy to tell apart stay so, and close ones stay close. The result is in sRGB, inside its
+ * gamut, with the alpha of @p color; a color outside sRGB is clipped first. Any other pair of appearances returns the
+ * color unchanged, and so does a color without a space or with a component that is not a number.
  */
 Color convertColor(const Color &color, Appearance source, Appearance target);
 
