@@ -1,0 +1,211 @@
+// Times what an app and its user wait for: from present() to the first frame of the picker in the app's window, with a
+// process started for it (cold) and with one started ahead, and from an input event at the app to the pick message and
+// to the changed frame. Also the memory of the picker's process. Medians with ranges; one JSON object on the last line.
+//
+// usage: favrin-bench-presenting [rounds]
+
+#include "host/fvcolorpickerviewcontroller.h"
+
+#include <QDir>
+#include <QElapsedTimer>
+#include <QEventLoop>
+#include <QFile>
+#include <QGuiApplication>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QMouseEvent>
+#include <QTemporaryDir>
+#include <QTimer>
+
+#include <algorithm>
+#include <cstdio>
+#include <functional>
+#include <vector>
+
+namespace {
+
+using State = FVColorPickerViewController::State;
+constexpr int dragSteps = 200;
+constexpr int patienceMilliseconds = 10'000;
+
+struct Samples
+{
+    const char *name;
+    const char *unit;
+    std::vector<double> values = {};
+
+    double at(double part) const { return values[static_cast<std::size_t>(part * double(values.size() - 1))]; }
+    QJsonObject report()
+    {
+        if (values.empty())
+            return {};
+        std::sort(values.begin(), values.end());
+        std::printf("%-44s %8.2f %s  (%.2f–%.2f, 99th percentile %.2f, n = %zu)\n", name, at(0.5), unit, values.front(),
+                    values.back(), at(0.99), values.size());
+        return {{QStringLiteral("median"), at(0.5)},
+                {QStringLiteral("min"), values.front()},
+                {QStringLiteral("max"), values.back()},
+                {QStringLiteral("p99"), at(0.99)}};
+    }
+};
+
+bool waitFor(const std::function<bool()> &condition)
+{
+    QElapsedTimer clock;
+    clock.start();
+    while (!condition()) {
+        if (clock.hasExpired(patienceMilliseconds))
+            return false;
+        QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents | QEventLoop::AllEvents);
+    }
+    return true;
+}
+
+double milliseconds(const QElapsedTimer &clock)
+{
+    return double(clock.nsecsElapsed()) / 1e6;
+}
+
+double processMemory(qint64 pid, const QByteArray &field, const char *file)
+{
+    QFile status(QStringLiteral("/proc/%1/%2").arg(pid).arg(QLatin1String(file)));
+    if (!status.open(QIODevice::ReadOnly))
+        return 0;
+    for (const auto &line : status.readAll().split('\n')) {
+        if (line.startsWith(field))
+            return line.mid(field.size()).trimmed().split(' ').first().toDouble() / 1024;
+    }
+    return 0;
+}
+
+qint64 servicePid()
+{
+    QFile children(QStringLiteral("/proc/self/task/%1/children").arg(QCoreApplication::applicationPid()));
+    return children.open(QIODevice::ReadOnly) ? children.readAll().trimmed().split(' ').last().toLongLong() : 0;
+}
+
+class Bench
+{
+public:
+    Bench()
+    {
+        m_window.resize(900, 700);
+        m_window.show();
+        QObject::connect(&m_window, &QQuickWindow::frameSwapped, &m_window, [this] { ++m_frames; });
+        QObject::connect(&m_picker, &FVColorPickerViewController::pickerDidSelectColor, &m_window,
+                         [this] { ++m_picks; });
+        m_picker.setReduceMotion(true);
+    }
+
+    bool present(Samples &samples, bool ahead)
+    {
+        if (ahead) {
+            FVColorPickerViewController::startServiceAhead();
+            QEventLoop rest;
+            QTimer::singleShot(400, &rest, &QEventLoop::quit);
+            rest.exec();
+        }
+        QElapsedTimer clock;
+        clock.start();
+        m_picker.present(&m_window);
+        if (!waitFor([this] { return m_picker.state() != State::Starting; }) || m_picker.state() != State::Ready)
+            return false;
+        const int before = m_frames;
+        if (!waitFor([&] { return m_frames > before; }))
+            return false;
+        samples.values.push_back(milliseconds(clock));
+        return true;
+    }
+
+    bool finish()
+    {
+        m_picker.dismiss();
+        return waitFor([this] { return m_picker.state() == State::NotRunning; });
+    }
+
+    bool drag(Samples &messages, Samples &frames)
+    {
+        const auto origin = m_picker.view()->mapToScene(QPointF(42, 77));
+        send(QEvent::MouseButtonPress, origin);
+        for (int step = 1; step <= dragSteps; ++step) {
+            settle();
+            // Always another swatch than the one before.
+            const QPointF position = origin + QPointF(44 * (step % 12), 44 * ((step / 12) % 10));
+            const int picks = m_picks;
+            const int shown = m_frames;
+            QElapsedTimer clock;
+            clock.start();
+            send(QEvent::MouseMove, position);
+            if (!waitFor([&] { return m_picks > picks; }))
+                return false;
+            messages.values.push_back(milliseconds(clock));
+            if (!waitFor([&] { return m_frames > shown; }))
+                return false;
+            frames.values.push_back(milliseconds(clock));
+        }
+        send(QEvent::MouseButtonRelease, origin);
+        return true;
+    }
+
+    void memory(Samples &proportional, Samples &peak)
+    {
+        const auto pid = servicePid();
+        proportional.values.push_back(processMemory(pid, "Pss:", "smaps_rollup"));
+        peak.values.push_back(processMemory(pid, "VmHWM:", "status"));
+    }
+
+private:
+    void send(QEvent::Type type, const QPointF &position)
+    {
+        const auto button = type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton;
+        const auto held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
+        QMouseEvent event(type, position, position, button, held, {});
+        QCoreApplication::sendEvent(&m_window, &event);
+    }
+    /** Nothing of the step before is on its way any more. */
+    void settle()
+    {
+        QEventLoop rest;
+        QTimer::singleShot(20, &rest, &QEventLoop::quit);
+        rest.exec();
+    }
+
+    QQuickWindow m_window;
+    FVColorPickerViewController m_picker;
+    int m_frames = 0;
+    int m_picks = 0;
+};
+
+} // namespace
+
+int main(int argc, char *argv[])
+{
+    const QTemporaryDir data;
+    qputenv("FAVRIN_DEFAULTS_FILE", QFile::encodeName(data.path() + QStringLiteral("/defaults.sqlite")));
+    if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+    QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
+    QGuiApplication application(argc, argv);
+    const int rounds = argc > 1 ? std::max(1, atoi(argv[1])) : 15;
+
+    Samples cold{"present to first frame, cold", "ms"};
+    Samples ahead{"present to first frame, started ahead", "ms"};
+    Samples message{"drag: event to pick message", "ms"};
+    Samples frame{"drag: event to changed frame", "ms"};
+    Samples memory{"service: proportional memory", "MB"};
+    Samples peak{"service: peak resident memory", "MB"};
+    Bench bench;
+    for (int round = 0; round < rounds; ++round) {
+        // In turns, so that a busy moment of the machine meets both.
+        if (!bench.present(cold, false) || (round == 0 && !bench.drag(message, frame)))
+            return 1;
+        bench.memory(memory, peak);
+        if (!bench.finish() || !bench.present(ahead, true) || !bench.finish())
+            return 1;
+    }
+    QJsonObject report;
+    for (auto *samples : {&cold, &ahead, &message, &frame, &memory, &peak})
+        report[QLatin1String(samples->name)] = samples->report();
+    std::printf("%s\n", QJsonDocument(report).toJson(QJsonDocument::Compact).constData());
+    return 0;
+}
