@@ -7,7 +7,7 @@
 #include <string>
 #include <vector>
 
-/** What travels between picker service and host, as values. Plain C++; both ends use them. Numbers as in the protocol. */
+/** What travels between picker service and host, as values; plain C++ for both ends. Numbers as in the protocol. */
 namespace favrin::remote {
 
 enum class PresentationContext : std::uint32_t { Unspecified = 0, Presented = 1, Embedded = 2, Popover = 3 };

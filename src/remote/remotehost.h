@@ -10,8 +10,8 @@
 namespace favrin::remote {
 
 /**
- * The host as the service sees it: the messages of `_FVColorPickerRemoteViewControllerHost`, and what a remote view tells
- * its host besides. One-way; none of them waits. May be called on any thread.
+ * The host as the service sees it: the messages of `_FVColorPickerRemoteViewControllerHost`, and what a remote view
+ * tells its host besides. One-way; none of them waits. May be called on any thread.
  */
 class RemoteHost
 {

@@ -11,7 +11,7 @@ namespace favrin::remote {
 namespace {
 
 /** The enums of the records are numbered from 0 without a gap. */
-template <class Enum>
+template<class Enum>
 Enum knownOr(Enum value, Enum last, Enum otherwise)
 {
     return value <= last ? value : otherwise;
@@ -44,8 +44,8 @@ Traits sanitized(Traits traits)
         knownOr(traits.presentationContext, PresentationContext::Popover, usual.presentationContext);
     traits.appearance = knownOr(traits.appearance, Appearance::Dark, usual.appearance);
     traits.layoutDirection = knownOr(traits.layoutDirection, LayoutDirection::RightToLeft, usual.layoutDirection);
-    traits.textSizeCategory = knownOr(traits.textSizeCategory, TextSizeCategory::AccessibilityExtraExtraExtraLarge,
-                                      usual.textSizeCategory);
+    traits.textSizeCategory =
+        knownOr(traits.textSizeCategory, TextSizeCategory::AccessibilityExtraExtraExtraLarge, usual.textSizeCategory);
     traits.displayGamut = knownOr(traits.displayGamut, DisplayGamut::P3, usual.displayGamut);
     traits.displayIdentifier = textOrNothing(std::move(traits.displayIdentifier));
     traits.locale = textOrNothing(std::move(traits.locale));

@@ -51,8 +51,8 @@ std::string nameOf(const Color &color)
 
 bool isFinite(const Color &color)
 {
-    return std::ranges::all_of(color.components(), [](double value) { return std::isfinite(value); })
-        && std::isfinite(color.alpha());
+    return std::ranges::all_of(color.components(), [](double value) { return std::isfinite(value); }) &&
+           std::isfinite(color.alpha());
 }
 
 std::optional<WireColor> encodeColor(const std::optional<Color> &color)

@@ -13,8 +13,8 @@
  * Colors on the wire: arrays of 64-bit floating-point numbers beside the platform name of their space.
  *
  * A named space keeps its components bit for bit. A color in a space without a name travels converted to linear sRGB,
- * unclipped. A color without a space travels without a name; so does, when it is read, a color whose space name this end
- * does not know: its components are kept, its meaning is not. Pure functions, any thread.
+ * unclipped. A color without a space travels without a name; so does, when it is read, a color whose space name this
+ * end does not know: its components are kept, its meaning is not. Pure functions, any thread.
  */
 namespace favrin::remote {
 
@@ -40,9 +40,10 @@ struct WireColorRun
 std::optional<WireColor> encodeColor(const std::optional<Color> &color);
 
 /** The outer value is missing when the array is malformed, the inner one when it says "no color". */
-std::optional<std::optional<Color>> decodeColor(std::span<const std::byte> array, std::optional<std::string_view> space);
+std::optional<std::optional<Color>> decodeColor(std::span<const std::byte> array,
+                                                std::optional<std::string_view> space);
 
-/** In the order given. Colors with a number that is not finite are left out, as are those past limits::suggestedColors. */
+/** In the order given, without colors that are not finite and those past limits::suggestedColors. */
 std::vector<WireColorRun> encodeColorRuns(std::span<const Color> colors);
 
 /** The colors of one run, or none when the array is malformed or holds more than limits::colorsPerEvent. */

@@ -21,7 +21,7 @@ std::uint32_t bitIf(bool set, std::uint32_t bit)
     return set ? bit : 0;
 }
 
-template <class T>
+template<class T>
 void makePresent(std::optional<T> &value, bool present)
 {
     if (!present)
@@ -34,11 +34,11 @@ void makePresent(std::optional<T> &value, bool present)
 
 std::uint32_t optionBits(const Configuration &configuration)
 {
-    return bitIf(configuration.showsAlpha, ShowsAlpha) | bitIf(configuration.allowsNoColor, AllowsNoColor)
-        | bitIf(configuration.showsEyedropper, ShowsEyedropper)
-        | bitIf(configuration.shouldUseDarkGridInDarkMode, UsesDarkGridInDarkMode)
-        | bitIf(configuration.isEmbedded, IsEmbedded) | bitIf(configuration.title.has_value(), HasTitle)
-        | bitIf(configuration.suggestedColors.has_value(), HasSuggestedColors);
+    return bitIf(configuration.showsAlpha, ShowsAlpha) | bitIf(configuration.allowsNoColor, AllowsNoColor) |
+           bitIf(configuration.showsEyedropper, ShowsEyedropper) |
+           bitIf(configuration.shouldUseDarkGridInDarkMode, UsesDarkGridInDarkMode) |
+           bitIf(configuration.isEmbedded, IsEmbedded) | bitIf(configuration.title.has_value(), HasTitle) |
+           bitIf(configuration.suggestedColors.has_value(), HasSuggestedColors);
 }
 
 void applyOptionBits(std::uint32_t bits, Configuration &configuration)

@@ -28,7 +28,10 @@ constexpr std::array<Lead, 9> leads = {{
     {0xf4, 0xf4, 3, 0x80, 0x8f},
 }};
 
-bool isFollower(unsigned char byte) { return (byte & 0xc0) == 0x80; }
+bool isFollower(unsigned char byte)
+{
+    return (byte & 0xc0) == 0x80;
+}
 
 /** Bytes of the character that @p text begins with, or 0 when it is not well-formed. */
 std::size_t characterLength(std::string_view text)
