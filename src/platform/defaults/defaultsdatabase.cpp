@@ -2,8 +2,8 @@
 
 #include <sqlite3.h>
 #include <sys/stat.h>
-#include <unistd.h>
 
+#include <cstdlib>
 #include <thread>
 
 namespace favrin::platform {
@@ -116,9 +116,7 @@ Outcome DefaultsDatabase::outcome(int result)
     case SQLITE_MISMATCH:
         return Outcome::Damaged;
     case SQLITE_READONLY:
-        // A broken header can forbid writing where the file system does not.
-        return ::access(m_file.c_str(), W_OK) == 0 && result == SQLITE_READONLY ? Outcome::Damaged
-                                                                                : Outcome::Unavailable;
+        return Outcome::ReadOnly;
     default:
         return Outcome::Unavailable;
     }
@@ -131,23 +129,38 @@ Outcome DefaultsDatabase::prepared(Statement &statement, const char *sql)
     return (result & 0xff) == SQLITE_ERROR ? Outcome::Damaged : outcome(result);
 }
 
-bool DefaultsDatabase::hasSchema() const
+Outcome DefaultsDatabase::lookForTables(bool &found)
 {
     Statement any;
-    return prepare(any, "SELECT 1 FROM sqlite_schema") != SQLITE_OK || sqlite3_step(any.get()) != SQLITE_DONE;
+    int result = prepare(any, "SELECT 1 FROM sqlite_schema");
+    if (result == SQLITE_OK)
+        result = sqlite3_step(any.get());
+    found = result == SQLITE_ROW;
+    return outcome(result);
+}
+
+Outcome DefaultsDatabase::prepareToRead(bool &isNew)
+{
+    if (m_select)
+        return Outcome::Done;
+    const auto first = prepared(m_select, selectSql);
+    if (first != Outcome::Damaged)
+        return first;
+    bool hasTables = false;
+    if (const auto looked = lookForTables(hasTables); looked != Outcome::Done || !hasTables) {
+        isNew = looked == Outcome::Done;
+        return looked;
+    }
+    // Once more: another process may have made the table in between.
+    return prepared(m_select, selectSql);
 }
 
 Outcome DefaultsDatabase::read(std::string_view key, std::optional<EncodedValue> &value)
 {
     value.reset();
-    if (!m_select) {
-        const auto select = prepared(m_select, selectSql);
-        // A file that nobody has written yet holds no table and no value.
-        if (select == Outcome::Damaged && !hasSchema())
-            return Outcome::Done;
-        if (select != Outcome::Done)
-            return select;
-    }
+    bool isNew = false;
+    if (const auto ready = prepareToRead(isNew); ready != Outcome::Done || isNew)
+        return ready;
     bindKey(m_select.get(), key);
     const int result = sqlite3_step(m_select.get());
     if (result == SQLITE_ROW)
@@ -157,20 +170,33 @@ Outcome DefaultsDatabase::read(std::string_view key, std::optional<EncodedValue>
     return (result & 0xff) == SQLITE_TOOBIG ? Outcome::Done : outcome(result);
 }
 
+Outcome DefaultsDatabase::check()
+{
+    Statement statement;
+    int result = prepare(statement, "PRAGMA quick_check(1)");
+    if (result == SQLITE_OK)
+        result = sqlite3_step(statement.get());
+    if (result != SQLITE_ROW)
+        return outcome(result);
+    const auto *text = reinterpret_cast<const char *>(sqlite3_column_text(statement.get(), 0));
+    m_reason = text ? text : "no verdict";
+    if (m_reason == "ok")
+        return Outcome::Done;
+    // A page that could not be read says nothing about what is on it.
+    constexpr std::string_view mark = "error code=";
+    const auto code = m_reason.find(mark);
+    const bool unreadable =
+        code != std::string::npos && (std::atoi(m_reason.c_str() + code + mark.size()) & 0xff) != SQLITE_CORRUPT;
+    return unreadable ? Outcome::Unavailable : Outcome::Damaged;
+}
+
 Outcome DefaultsDatabase::prepareToWrite()
 {
     if (m_readyToWrite)
         return Outcome::Done;
     // Before the first write the whole file is checked, so that nothing is built on a broken one.
-    Statement check;
-    if (const int result = prepare(check, "PRAGMA quick_check(1)"); result != SQLITE_OK)
-        return outcome(result);
-    if (const int result = sqlite3_step(check.get()); result != SQLITE_ROW)
-        return outcome(result);
-    const auto *verdict = sqlite3_column_text(check.get(), 0);
-    if (!verdict || std::string_view(reinterpret_cast<const char *>(verdict)) != "ok")
-        return Outcome::Damaged;
-    check.reset();
+    if (const auto checked = check(); checked != Outcome::Done)
+        return checked;
     ::chmod(m_file.c_str(), 0600);
     if (const int result = execute("PRAGMA synchronous=FULL"); result != SQLITE_OK)
         return outcome(result);
@@ -184,14 +210,15 @@ Outcome DefaultsDatabase::prepareToWrite()
 
 Outcome DefaultsDatabase::makeTable()
 {
-    if (hasSchema())
-        return Outcome::Done;
+    bool found = false;
+    if (const auto looked = lookForTables(found); looked != Outcome::Done || found)
+        return looked;
     // One process at a time: two that switch a new file to its write-ahead log would wait for each other.
     const defaultsfile::FolderLock lock(m_file, m_deadline);
     if (!lock)
         return Outcome::Unavailable;
-    if (hasSchema())
-        return Outcome::Done;
+    if (const auto looked = lookForTables(found); looked != Outcome::Done || found)
+        return looked;
     // The file keeps the mode. Where the log cannot be had, SQLite stays with its rollback journal: slower, as safe.
     execute("PRAGMA page_size=4096; PRAGMA journal_mode=WAL");
     return outcome(execute(createSql));

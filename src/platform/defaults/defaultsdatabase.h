@@ -21,6 +21,8 @@ enum class Outcome {
     Done,
     /** The file is no database of ours, or its content is broken. */
     Damaged,
+    /** The file was opened for reading only, by right, by a passing fault or by what its header says. */
+    ReadOnly,
     /** Nothing could be done now: no right, no space, a failing disk, another process at work for too long. */
     Unavailable
 };
@@ -66,7 +68,9 @@ private:
     int prepare(Statement &statement, const char *sql) const;
     Outcome prepared(Statement &statement, const char *sql);
     int execute(const char *sql) const;
-    bool hasSchema() const;
+    Outcome lookForTables(bool &found);
+    Outcome prepareToRead(bool &isNew);
+    Outcome check();
     Outcome prepareToWrite();
     Outcome makeTable();
     Outcome outcome(int result);

@@ -133,6 +133,15 @@ std::optional<FileIdentity> identity(const fs::path &file)
     return FileIdentity{status.st_dev, status.st_ino};
 }
 
+bool claimsReadOnlyFormat(const fs::path &file)
+{
+    // Two bytes for the formats of writing and reading: 1 with a rollback journal, 2 with a write-ahead log.
+    constexpr off_t formatOffset = 18;
+    std::array<unsigned char, 2> formats = {};
+    const Descriptor descriptor(file, O_RDONLY | O_NONBLOCK);
+    return descriptor && ::pread(*descriptor, formats.data(), formats.size(), formatOffset) == 2 && formats[0] > 2;
+}
+
 bool create(const fs::path &file)
 {
     if (!makeFolder(folderOf(file)))

@@ -38,6 +38,12 @@ Condition inspect(const std::filesystem::path &file);
 /** The file under this name, symbolic links followed; none when there is none. */
 std::optional<FileIdentity> identity(const std::filesystem::path &file);
 
+/**
+ * True when the header of the database claims a format that SQLite may only read. Call it while this process has no
+ * connection to the file: closing the file here ends the locks of a connection.
+ */
+bool claimsReadOnlyFormat(const std::filesystem::path &file);
+
 /** Makes an empty file for its owner alone, and its folders where they are missing, durably. */
 bool create(const std::filesystem::path &file);
 

@@ -53,7 +53,7 @@ struct UserDefaults::Private
 
     Outcome perform(Access access, const std::function<Outcome(DefaultsDatabase &)> &step);
     Outcome open(Access access);
-    bool setAside(DefaultsDatabase::Clock::time_point deadline);
+    std::optional<FileIdentity> giveUp();
     void report(const char *what);
 
     bool isStored(std::string_view key, const std::optional<EncodedValue> &value);
@@ -110,17 +110,15 @@ Outcome UserDefaults::Private::open(Access access)
     return outcome;
 }
 
-bool UserDefaults::Private::setAside(DefaultsDatabase::Clock::time_point deadline)
+/** Closes a database that could not be used as it was, and says which file that was. */
+std::optional<FileIdentity> UserDefaults::Private::giveUp()
 {
-    std::optional<FileIdentity> damaged;
-    if (database) {
-        damaged = database->identity();
-        database->keepFilesOnClose();
-        database.reset();
-    }
-    defaultsLog().warning("The user defaults in " + file.string() +
-                          " are damaged; they are set aside and the settings start anew");
-    return defaultsfile::setAside(file, damaged, deadline);
+    if (!database)
+        return {};
+    const auto identity = database->identity();
+    database->keepFilesOnClose();
+    database.reset();
+    return identity;
 }
 
 void UserDefaults::Private::report(const char *what)
@@ -138,8 +136,10 @@ Outcome UserDefaults::Private::perform(Access access, const std::function<Outcom
     if (working)
         return Outcome::Unavailable;
     const auto deadline = DefaultsDatabase::Clock::now() + longestWait;
-    // The second round works on the new file, the third on what another process may have done meanwhile.
-    for (int round = 0; round < 3; ++round) {
+    std::optional<FileIdentity> suspect;
+    // A file is found damaged twice before it is set aside; then there is a new one, and once more what another process
+    // may have done meanwhile.
+    for (int round = 0; round < 4; ++round) {
         auto outcome = open(access);
         if (outcome == Outcome::Done && database) {
             database->setDeadline(deadline);
@@ -147,9 +147,20 @@ Outcome UserDefaults::Private::perform(Access access, const std::function<Outcom
             outcome = step(*database);
             working = false;
         }
-        if (outcome != Outcome::Damaged)
+        if (outcome != Outcome::Damaged && outcome != Outcome::ReadOnly)
             return outcome;
-        if (!setAside(deadline))
+        // The next round or the next call opens the file anew: what kept it from being written may have passed.
+        const auto unusable = giveUp();
+        if (outcome == Outcome::ReadOnly && !defaultsfile::claimsReadOnlyFormat(file))
+            break;
+        // A disk that failed to give a page for a moment makes a file look damaged, too.
+        if (unusable && suspect != unusable) {
+            suspect = unusable;
+            continue;
+        }
+        defaultsLog().warning("The user defaults in " + file.string() +
+                              " are damaged; they are set aside and the settings start anew");
+        if (!defaultsfile::setAside(file, unusable, deadline))
             break;
     }
     return Outcome::Unavailable;

@@ -355,6 +355,33 @@ private Q_SLOTS:
         QVERIFY(UserDefaults(m_file).bytes("key") == Bytes(100'000, 1));
     }
 
+    void aShortageOfDescriptorsPassesWithoutLoss_data()
+    {
+        QTest::addColumn<int>("available");
+        QTest::addRow("none") << 0;
+        QTest::addRow("for the file") << 1;
+        QTest::addRow("for its log as well") << 2;
+    }
+    void aShortageOfDescriptorsPassesWithoutLoss()
+    {
+        QFETCH(const int, available);
+        goodFile(m_file);
+        UserDefaults defaults(m_file);
+        rlimit previous;
+        QCOMPARE(::getrlimit(RLIMIT_NOFILE, &previous), 0);
+        const int next = ::dup(0);
+        ::close(next);
+        const rlimit shortage{rlim_t(next + available), previous.rlim_max};
+        QCOMPARE(::setrlimit(RLIMIT_NOFILE, &shortage), 0);
+        const bool written = defaults.set("key", std::string("after"));
+        QCOMPARE(::setrlimit(RLIMIT_NOFILE, &previous), 0);
+        QVERIFY(!written);
+        QVERIFY(UserDefaults(m_file).string("key") == "before");
+        QVERIFY(defaults.set("other", std::string("x")));
+        QVERIFY(UserDefaults(m_file).string("key") == "after");
+        QVERIFY(setAside(m_file).isEmpty());
+    }
+
     void aFileTakenAwayIsNotWrittenInto()
     {
         UserDefaults defaults(m_file);
