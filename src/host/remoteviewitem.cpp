@@ -10,6 +10,7 @@
 #include <QGuiApplication>
 #include <QInputMethod>
 #include <QQuickWindow>
+#include <QSGRendererInterface>
 
 #include <cmath>
 #include <utility>
@@ -85,6 +86,19 @@ void RemoteViewItem::surfaceDidChange(const QRegion &damage)
 {
     m_damage += damage;
     update();
+    hastenFrame();
+}
+
+void RemoteViewItem::hastenFrame()
+{
+    // X11 and the platforms without a display put off each frame by an idle timer of 5 ms, which a drag would feel. A
+    // frame that is asked for by its event is drawn in this turn of the event loop; the timer then finds nothing to do.
+    // Wayland paces frames itself, and with a GPU the render loop waits for the display.
+    const bool software = window() && window()->rendererInterface()->graphicsApi() == QSGRendererInterface::Software;
+    if (!software || !window()->isExposed() || QGuiApplication::platformName().startsWith(u"wayland"))
+        return;
+    if (!std::exchange(m_frameIsHastened, true))
+        QCoreApplication::postEvent(window(), new QEvent(QEvent::UpdateRequest));
 }
 
 QSGNode *RemoteViewItem::updatePaintNode(QSGNode *oldNode, UpdatePaintNodeData *)
@@ -107,6 +121,7 @@ QSGNode *RemoteViewItem::updatePaintNode(QSGNode *oldNode, UpdatePaintNodeData *
 
 void RemoteViewItem::frameWasSwapped()
 {
+    m_frameIsHastened = false;
     if (!std::exchange(m_waitingForSwap, false) || !m_session || m_session->hasEnded())
         return;
     m_session->server().frameWasShown(m_session->now());
@@ -230,17 +245,21 @@ QVariant RemoteViewItem::inputMethodQuery(Qt::InputMethodQuery query) const
 
 void RemoteViewItem::textInputDidChange()
 {
-    const bool enabled = m_session->textInput().enabled;
-    const bool changed = flags().testFlag(ItemAcceptsInputMethod) != enabled;
-    setFlag(ItemAcceptsInputMethod, enabled);
+    const auto &state = m_session->textInput();
+    const bool toggled = flags().testFlag(ItemAcceptsInputMethod) != state.enabled;
+    setFlag(ItemAcceptsInputMethod, state.enabled);
+    const bool forgotten = std::exchange(m_inputMethodResets, state.resets) != state.resets;
     if (!hasActiveFocus())
         return;
-    if (changed && enabled)
+    if (toggled && state.enabled)
         m_clipboard->offer();
     auto *inputMethod = QGuiApplication::inputMethod();
-    inputMethod->update(changed ? Qt::ImQueryAll : Qt::ImQueryInput | Qt::ImHints);
-    if (changed)
-        inputMethod->setVisible(enabled);
+    if (forgotten)
+        inputMethod->reset();
+    inputMethod->update(toggled ? Qt::ImQueryAll : Qt::ImQueryInput | Qt::ImHints);
+    const bool wantsPanel = state.enabled && state.wantsInputPanel;
+    if (std::exchange(m_inputPanelWanted, wantsPanel) != wantsPanel)
+        inputMethod->setVisible(wantsPanel);
 }
 
 void RemoteViewItem::focusInEvent(QFocusEvent *event)

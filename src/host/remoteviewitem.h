@@ -63,6 +63,7 @@ protected:
 private:
     void followWindow(QQuickWindow *window);
     void surfaceDidChange(const QRegion &damage);
+    void hastenFrame();
     void frameWasSwapped();
     void textInputDidChange();
 
@@ -75,6 +76,9 @@ private:
     bool m_imageIsNew = false;
     /** A frame of the service has been put into the scene and the window has not shown it yet. */
     bool m_waitingForSwap = false;
+    bool m_frameIsHastened = false;
+    std::uint32_t m_inputMethodResets = 0;
+    bool m_inputPanelWanted = false;
 };
 
 } // namespace favrin::host

@@ -1,5 +1,6 @@
 #include "host/remoteviewsession.h"
 
+#include "host/hostlog.h"
 #include "host/serviceprocess.h"
 
 #include <QSocketNotifier>
@@ -89,6 +90,7 @@ public:
     {
         Q_EMIT m_session.responsivenessDidChange(responsive);
     }
+    void serverDidWarn(const std::string &message) override { qCWarning(hostLog).noquote() << message.c_str(); }
     void connectionDidClose(server::CloseReason reason, const std::string &detail) override
     {
         m_session.finish(closeText(reason, detail));
@@ -163,6 +165,7 @@ void RemoteViewSession::finish(const QString &error)
         m_notifier->setEnabled(false);
     // Disconnected for its faults, it may still be running.
     m_process->kill();
+    qCWarning(hostLog).noquote() << error << "The color picker is no longer shown.";
     Q_EMIT ended(error);
 }
 

@@ -25,6 +25,7 @@ private Q_SLOTS:
     void theUserEndsThePresentation_data();
     void theUserEndsThePresentation();
     void theAppEndsThePresentation();
+    void aGestureThatTheEndCutsOffIsMadeFinal();
     void anEmbeddedPickerFillsItsContainer();
     void aKilledServiceIsReportedAndPresentingAgainWorks();
     void aServiceThatCannotRunIsReported_data();
@@ -190,6 +191,21 @@ void RoadTest::theAppEndsThePresentation()
     host.picker.dismiss();
     QTRY_COMPARE(finished.size(), 2);
     QVERIFY(host.picks.empty());
+}
+
+void RoadTest::aGestureThatTheEndCutsOffIsMadeFinal()
+{
+    RoadHost host;
+    QSignalSpy finished(&host.picker, &FVColorPickerViewController::colorPickerDidFinish);
+    host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+    QTest::mousePress(&host.window, Qt::LeftButton, {}, host.swatch(0, 0));
+    QTRY_VERIFY(host.picks.size() >= 2);
+    host.picker.dismiss();
+    QTRY_COMPARE(finished.size(), 1);
+    QVERIFY(!host.picks.back().isVolatile);
+    QCOMPARE(host.picks.back().color, FVColor(1, 1, 1));
+    QTest::mouseRelease(&host.window, Qt::LeftButton, {}, QPoint(5, 5));
 }
 
 void RoadTest::anEmbeddedPickerFillsItsContainer()

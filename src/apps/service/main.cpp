@@ -12,6 +12,7 @@
 namespace {
 
 constexpr int noHost = 3;
+QtMessageHandler previousMessageHandler = nullptr;
 
 /** What Qt must know before it starts: the host's private server, drawing by the processor, frames without waiting. */
 void prepareEnvironment()
@@ -28,6 +29,13 @@ void prepareEnvironment()
     QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
 }
 
+/** A host that leaves is the ordinary end of this process; the platform plugin's complaint about it is noise. */
+void dropFarewell(QtMsgType type, const QMessageLogContext &context, const QString &message)
+{
+    if (!message.startsWith(u"The Wayland connection broke"))
+        previousMessageHandler(type, context, message);
+}
+
 } // namespace
 
 int main(int argc, char *argv[])
@@ -37,6 +45,7 @@ int main(int argc, char *argv[])
                    stderr);
         return noHost;
     }
+    previousMessageHandler = qInstallMessageHandler(dropFarewell);
     prepareEnvironment();
     QGuiApplication application(argc, argv);
     QGuiApplication::setApplicationName(QStringLiteral("favrin-color-picker-service"));

@@ -127,4 +127,11 @@ void PickerService::shouldPresent()
         picker->view()->forceActiveFocus();
 }
 
+void PickerService::presentationWillEnd()
+{
+    // A gesture that the end cuts off reports its last color as final.
+    if (m_front)
+        m_front->setAppeared(false);
+}
+
 } // namespace favrin::apps

@@ -34,6 +34,7 @@ public:
 private:
     void traitsDidChange(const remote::Traits &traits) override;
     void shouldPresent() override;
+    void presentationWillEnd() override;
     remote::RemoteViewController *remoteViewController() override;
 
     void applySurroundings(const remote::Traits &traits);

@@ -152,6 +152,7 @@ void RemoteViewConnection::colorPickerDidFinish()
 {
     if (!d->view)
         return;
+    d->delegate.presentationWillEnd();
     favrin_remote_view_v1_color_picker_did_finish(d->view);
     d->flush();
 }

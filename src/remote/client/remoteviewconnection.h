@@ -18,6 +18,8 @@ public:
     virtual void traitsDidChange(const Traits &traits) = 0;
     /** The app presents the picker now. */
     virtual void shouldPresent() = 0;
+    /** Called before the host hears of the end, so that what the picker still has to say comes first. */
+    virtual void presentationWillEnd() = 0;
     /** The controller that hears the host's messages; null while there is none. */
     virtual RemoteViewController *remoteViewController() = 0;
 };

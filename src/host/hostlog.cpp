@@ -1,0 +1,7 @@
+#include "host/hostlog.h"
+
+namespace favrin::host {
+
+Q_LOGGING_CATEGORY(hostLog, "com.quenta.favrin.ColorPicker.Host", QtWarningMsg)
+
+} // namespace favrin::host
