@@ -1,12 +1,9 @@
 #include "host/keyboardforwarder.h"
 
-#include "host/hostkeymap.h"
 #include "host/remoteviewsession.h"
 
-#include <QGuiApplication>
 #include <QInputMethodEvent>
 #include <QKeyEvent>
-#include <QStyleHints>
 
 #include <array>
 #include <utility>
@@ -91,11 +88,6 @@ void KeyboardForwarder::setSession(RemoteViewSession *session)
 {
     m_session = session;
     m_focused = false;
-    if (!session)
-        return;
-    session->server().setKeymap(hostKeymap());
-    const auto *hints = QGuiApplication::styleHints();
-    session->server().setRepeat(static_cast<int>(hints->keyboardAutoRepeatRate()), hints->keyboardInputInterval());
 }
 
 void KeyboardForwarder::focusIn()

@@ -76,9 +76,10 @@ void paintShadow(QPainter &painter, const QRectF &panel)
     const std::array<double, 4> sourceEdges = {0, half, half + 1, tile.width() * 1.0};
     const std::array<double, 4> columns = {place.left(), place.left() + half, place.right() - half, place.right()};
     const std::array<double, 4> rows = {place.top(), place.top() + half, place.bottom() - half, place.bottom()};
-    painter.setRenderHint(QPainter::SmoothPixmapTransform);
     for (std::size_t row = 0; row < 3; ++row) {
         for (std::size_t column = 0; column < 3; ++column) {
+            if (row == 1 && column == 1)
+                continue;
             painter.drawImage(QRectF(QPointF(columns[column], rows[row]), QPointF(columns[column + 1], rows[row + 1])),
                               tile,
                               QRectF(QPointF(sourceEdges[column], sourceEdges[row]),
@@ -150,18 +151,14 @@ QPainterPath PresentationPanel::outline() const
 
 void PresentationPanel::paint(QPainter *painter)
 {
-    painter->setRenderHint(QPainter::Antialiasing);
     const QPainterPath path = outline();
-    // Only outside of the panel, which may be translucent.
-    painter->save();
-    QPainterPath outside;
-    outside.addRect(QRectF(QPointF(), size()));
-    painter->setClipPath(outside.subtracted(path));
     paintShadow(*painter, contentRectangle().translated(0, shadowDrop));
-    painter->restore();
-    painter->setPen(QPen(edgeColor(m_dark), 1));
-    painter->setBrush(m_material ? materialColor(m_dark) : panelColor(m_dark));
-    painter->drawPath(path);
+    painter->setRenderHint(QPainter::Antialiasing);
+    // In place of the shadow, not over it: the panel may be translucent, and a clip would cost more than all the rest.
+    painter->setCompositionMode(QPainter::CompositionMode_Source);
+    painter->fillPath(path, m_material ? materialColor(m_dark) : panelColor(m_dark));
+    painter->setCompositionMode(QPainter::CompositionMode_SourceOver);
+    painter->strokePath(path, QPen(edgeColor(m_dark), 1));
 }
 
 void PresentationPanel::mousePressEvent(QMouseEvent *event)

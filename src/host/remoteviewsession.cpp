@@ -1,9 +1,12 @@
 #include "host/remoteviewsession.h"
 
+#include "host/hostkeymap.h"
 #include "host/hostlog.h"
 #include "host/serviceprocess.h"
 
+#include <QGuiApplication>
 #include <QSocketNotifier>
+#include <QStyleHints>
 #include <QTimer>
 
 #include <cstring>
@@ -126,7 +129,12 @@ QString RemoteViewSession::start()
         dispatch();
         finish(QStringLiteral("The color picker's process ended: %1.").arg(description));
     });
-    return m_process->start(socket);
+    const QString error = m_process->start(socket);
+    // Compiling a keymap takes longer than anything else here; meanwhile the process is being loaded.
+    m_server->setKeymap(hostKeymap());
+    const auto *hints = QGuiApplication::styleHints();
+    m_server->setRepeat(static_cast<int>(hints->keyboardAutoRepeatRate()), hints->keyboardInputInterval());
+    return error;
 }
 
 void RemoteViewSession::end()

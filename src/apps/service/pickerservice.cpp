@@ -12,10 +12,18 @@
 #include <QQuickItem>
 #include <QQuickWindow>
 #include <QSurfaceFormat>
+#include <QTimer>
+
+#include <chrono>
 
 namespace favrin::apps {
 
 namespace {
+
+using namespace std::chrono_literals;
+
+/** Nobody presents for so long: then this service was started ahead of time. */
+constexpr auto quietTime = 100ms;
 
 platform::TraitCollection traitCollection(const remote::Traits &traits)
 {
@@ -50,8 +58,17 @@ void PickerService::traitsDidChange(const remote::Traits &traits)
         build();
     m_front->eyedropper().setDisplayIdentifier(traits.displayIdentifier);
     m_front->setTraits(traitCollection(traits));
-    if (first)
-        m_connection.sendReady();
+    if (!first)
+        return;
+    m_connection.sendReady();
+    QTimer::singleShot(quietTime, this, &PickerService::warmUp);
+}
+
+void PickerService::warmUp()
+{
+    // A service that was started ahead of time draws once for nobody: fonts, glyphs and pictures are then there.
+    if (!m_window->isVisible())
+        m_window->grabWindow();
 }
 
 void PickerService::applySurroundings(const remote::Traits &traits)

@@ -39,6 +39,7 @@ private:
 
     void applySurroundings(const remote::Traits &traits);
     void build();
+    void warmUp();
     void settleBeforePresenting();
     void followWindowSize();
 
