@@ -22,10 +22,9 @@ QString hexText(const FVColor &color)
 QString numbersText(const FVColor &color, const QString &colorspace)
 {
     const auto number = [](double component) { return QString::number(component, 'f', 3); };
-    return QStringLiteral("%1  %2  %3  ·  %4 %  ·  %5")
-        .arg(number(color.red()), number(color.green()), number(color.blue()))
-        .arg(std::lround(color.alpha() * 100.0))
-        .arg(colorspace.isEmpty() ? QStringLiteral("–") : colorspace);
+    return QStringLiteral("%1 %2 %3 · %4 · %5")
+        .arg(number(color.red()), number(color.green()), number(color.blue()), QString::number(color.alpha(), 'f', 2),
+             colorspace.isEmpty() ? QStringLiteral("–") : colorspace);
 }
 
 } // namespace

@@ -34,7 +34,45 @@ QQuickItem *findItem(QQuickItem *root, const QString &name)
     return nullptr;
 }
 
+/** Nothing of what lies behind shows through any more. */
+bool isOpaque(const QQuickItem *item)
+{
+    for (; item; item = item->parentItem()) {
+        if (!item->isVisible() || item->opacity() < 1.0)
+            return false;
+    }
+    return true;
+}
+
 } // namespace
+
+/** One way to show the picker, and what is done with it. */
+struct TourScript::Scene
+{
+    QString text;
+    QString button;
+    /** The part of the poster that is colored. */
+    QString part;
+    /** A stroke over the colors, in fractions of their width and height. */
+    QPointF from;
+    QPointF to;
+};
+
+const TourScript::Scene TourScript::presented{QStringLiteral("presents the picker over the poster"),
+                                              QStringLiteral("presentButton"),
+                                              QStringLiteral("partSun"),
+                                              {0.06, 0.30},
+                                              {0.62, 0.55}};
+const TourScript::Scene TourScript::popover{QStringLiteral("shows the picker in a popover"),
+                                            QStringLiteral("popoverButton"),
+                                            QStringLiteral("partHills"),
+                                            {0.70, 0.75},
+                                            {0.06, 0.35}};
+const TourScript::Scene TourScript::embedded{QStringLiteral("embeds the picker in the inspector"),
+                                             QStringLiteral("embedButton"),
+                                             QStringLiteral("partWater"),
+                                             {0.55, 0.80},
+                                             {0.15, 0.15}};
 
 TourScript::TourScript(QQuickWindow *window, Gallery *gallery, const QString &folder, Tour *tour)
     : QObject(tour), m_window(window), m_gallery(gallery), m_folder(folder), m_tour(tour), m_finger(window)
@@ -49,33 +87,46 @@ void TourScript::addEverything()
     for (const Appearance appearance : {Appearance::Light, Appearance::Dark}) {
         const QString suffix = appearance == Appearance::Dark ? QStringLiteral("-dark") : QStringLiteral("-light");
         addSurroundings(appearance, Direction::LeftToRight, desktopSize);
-        addPresentation(QStringLiteral("present"), QStringLiteral("presented") + suffix);
-        addPresentation(QStringLiteral("popover"), QStringLiteral("popover") + suffix);
-        addPresentation(QStringLiteral("embed"), QStringLiteral("embedded") + suffix);
+        addScene(presented, QStringLiteral("presented") + suffix);
+        addScene(popover, QStringLiteral("popover") + suffix);
+        addScene(embedded, QStringLiteral("embedded") + suffix);
     }
     addSurroundings(Appearance::Light, Direction::RightToLeft, desktopSize);
-    addPresentation(QStringLiteral("present"), QStringLiteral("presented-right-to-left"));
-    addPresentation(QStringLiteral("embed"), QStringLiteral("embedded-right-to-left"));
+    addScene(presented, QStringLiteral("presented-right-to-left"));
+    addScene(embedded, QStringLiteral("embedded-right-to-left"));
     addSurroundings(Appearance::Light, Direction::LeftToRight, phoneSize);
-    addPresentation(QStringLiteral("present"), QStringLiteral("presented-phone"));
+    addScene(presented, QStringLiteral("presented-phone"));
     addSurroundings(Appearance::Dark, Direction::LeftToRight, phoneSize);
-    addPresentation(QStringLiteral("embed"), QStringLiteral("embedded-phone-dark"));
+    addScene(embedded, QStringLiteral("embedded-phone-dark"));
     addSurroundings(Appearance::Light, Direction::LeftToRight, tabletSize);
-    addPresentation(QStringLiteral("popover"), QStringLiteral("popover-tablet"));
+    addScene(popover, QStringLiteral("popover-tablet"));
     addScaledProcess();
 }
 
 void TourScript::addScaledPicture()
 {
     addSurroundings(Appearance::Light, Direction::LeftToRight, desktopSize);
-    addPresentation(QStringLiteral("present"), QStringLiteral("presented-light-3x"));
+    addScene(presented, QStringLiteral("presented-light-3x"));
+}
+
+void TourScript::addStep(const QString &text, Tour::Action action, Tour::Condition isDone)
+{
+    m_tour->add(
+        text,
+        [this, action = std::move(action)] {
+            // What was still before this step says nothing about what it brings.
+            m_lastGrab = {};
+            if (action)
+                action();
+        },
+        std::move(isDone));
 }
 
 void TourScript::addSurroundings(Appearance appearance, Direction direction, QSize windowSize)
 {
     const bool dark = appearance == Appearance::Dark;
     const bool mirrored = direction == Direction::RightToLeft;
-    m_tour->add(
+    addStep(
         QStringLiteral("gives the window %1 × %2 points").arg(windowSize.width()).arg(windowSize.height()),
         [this, windowSize] { m_window->resize(windowSize); },
         [this, windowSize] { return m_window->size() == windowSize && isStill(); });
@@ -87,39 +138,45 @@ void TourScript::addSurroundings(Appearance appearance, Direction direction, QSi
            [this, mirrored] { return m_gallery->isMirrored() == mirrored && isStill(); });
 }
 
-void TourScript::addPresentation(const QString &button, const QString &picture)
+void TourScript::addScene(const Scene &scene, const QString &picture)
 {
-    addTap(QStringLiteral("shows the picker: %1").arg(button), button + QStringLiteral("Button"), [this] {
-        if (!m_gallery->presenter()->isReady() || !isStill())
+    addTap(QStringLiteral("selects a part of the poster"), scene.part, [] { return true; });
+    addTap(scene.text, scene.button, [this] {
+        if (!m_gallery->presenter()->isReady() || !isOpaque(m_gallery->picker()->view()) || !isStill())
             return false;
         m_colors = colors();
         return !m_colors.isEmpty();
     });
     if (m_recorder)
-        addDrag();
+        addStroke(scene);
     addPicture(picture);
     addDismissal();
 }
 
 void TourScript::addTap(const QString &text, const QString &itemName, Tour::Condition isDone)
 {
-    m_tour->add(
+    addStep(
         text, [this, itemName] { tap(itemName); }, std::move(isDone));
 }
 
-void TourScript::addDrag()
+void TourScript::addStroke(const Scene &scene)
 {
+    constexpr int moves = 4;
     const auto anotherPick = [this] { return m_recorder->volatilePicks() > m_picksBefore; };
-    const auto touch = [this](double x, double y, void (Fingertip::*touches)(QPointF)) {
-        return [this, x, y, touches] {
-            m_picksBefore = m_recorder->volatilePicks();
-            (m_finger.*touches)(colorAt(x, y));
-        };
-    };
-    m_tour->add(QStringLiteral("touches a color"), touch(0.06, 0.3, &Fingertip::press), anotherPick);
-    for (const double way : {0.2, 0.35, 0.5, 0.62})
-        m_tour->add(QStringLiteral("drags on"), touch(way, 0.3 + 0.4 * way, &Fingertip::move), anotherPick);
-    m_tour->add(
+    for (int move = 0; move <= moves; ++move) {
+        const QPointF place = scene.from + (scene.to - scene.from) * move / moves;
+        addStep(
+            move == 0 ? QStringLiteral("touches a color") : QStringLiteral("drags on"),
+            [this, place, move] {
+                m_picksBefore = m_recorder->volatilePicks();
+                if (move == 0)
+                    m_finger.press(colorAt(place));
+                else
+                    m_finger.move(colorAt(place));
+            },
+            anotherPick);
+    }
+    addStep(
         QStringLiteral("lifts the finger"),
         [this] {
             m_picksBefore = m_recorder->finalPicks();
@@ -131,7 +188,7 @@ void TourScript::addDrag()
 void TourScript::addPicture(const QString &name)
 {
     const QString path = QDir(m_folder).filePath(name + QStringLiteral(".png"));
-    m_tour->add(QStringLiteral("takes the picture %1").arg(path), {}, [this, path] {
+    addStep(QStringLiteral("takes the picture %1").arg(path), {}, [this, path] {
         if (!isStill())
             return false;
         if (!m_lastGrab.save(path))
@@ -142,7 +199,7 @@ void TourScript::addPicture(const QString &name)
 
 void TourScript::addDismissal()
 {
-    m_tour->add(
+    addStep(
         QStringLiteral("ends the presentation"), [this] { m_gallery->presenter()->dismiss(); },
         [this] { return m_gallery->picker()->state() == FVColorPickerViewController::State::NotRunning && isStill(); });
 }
@@ -154,7 +211,7 @@ void TourScript::addScaledProcess()
             m_tour->fail(QStringLiteral("the process ended with status %1").arg(exitCode));
     });
     connect(&m_scaledProcess, &QProcess::errorOccurred, this, [this] { m_tour->fail(m_scaledProcess.errorString()); });
-    m_tour->add(
+    addStep(
         QStringLiteral("starts again at three times the scale"),
         [this] {
             QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
@@ -192,9 +249,9 @@ QRectF TourScript::colors() const
     return {area.topLeft() / scale, area.size() / scale};
 }
 
-QPointF TourScript::colorAt(double x, double y) const
+QPointF TourScript::colorAt(QPointF place) const
 {
-    return m_colors.topLeft() + QPointF(x * m_colors.width(), y * m_colors.height());
+    return m_colors.topLeft() + QPointF(place.x() * m_colors.width(), place.y() * m_colors.height());
 }
 
 bool TourScript::isStill()

@@ -29,11 +29,16 @@ public:
 private:
     enum class Appearance { Light, Dark };
     enum class Direction { LeftToRight, RightToLeft };
+    struct Scene;
+    static const Scene presented;
+    static const Scene popover;
+    static const Scene embedded;
 
+    void addStep(const QString &text, Tour::Action action, Tour::Condition isDone);
     void addSurroundings(Appearance appearance, Direction direction, QSize windowSize);
-    void addPresentation(const QString &button, const QString &picture);
+    void addScene(const Scene &scene, const QString &picture);
+    void addStroke(const Scene &scene);
     void addTap(const QString &text, const QString &itemName, Tour::Condition isDone);
-    void addDrag();
     void addPicture(const QString &name);
     void addDismissal();
     void addScaledProcess();
@@ -42,7 +47,7 @@ private:
     void tap(const QString &itemName);
     /** Where the picker shows its colors, in points of the window. */
     QRectF colors() const;
-    QPointF colorAt(double x, double y) const;
+    QPointF colorAt(QPointF place) const;
     bool isStill();
 
     QQuickWindow *m_window;
