@@ -18,8 +18,11 @@ class RemoteSurface;
 /**
  * The surface in the scene graph: strips that share one texture, so that the software scene graph repaints only those
  * that changed. Lives on the render thread; the surface is read while the main thread waits.
+ *
+ * A transform node only because the software scene graph forgets where a plain node lies: strips added to one later
+ * would be drawn at the corner of the window.
  */
-class RemoteSurfaceNode : public QSGNode
+class RemoteSurfaceNode : public QSGTransformNode
 {
 public:
     explicit RemoteSurfaceNode(QQuickWindow &window);
