@@ -53,6 +53,8 @@ bool waitFor(const std::function<bool()> &condition)
 {
     QElapsedTimer clock;
     clock.start();
+    QTimer wakeUp;
+    wakeUp.start(patienceMilliseconds);
     while (!condition()) {
         if (clock.hasExpired(patienceMilliseconds))
             return false;
@@ -94,6 +96,9 @@ public:
         QObject::connect(&m_window, &QQuickWindow::frameSwapped, &m_window, [this] { ++m_frames; });
         QObject::connect(&m_picker, &FVColorPickerViewController::pickerDidSelectColor, &m_window,
                          [this] { ++m_picks; });
+        // The picker has drawn; the next frame of the window shows it.
+        QObject::connect(&m_picker, &FVColorPickerViewController::stateChanged, &m_window,
+                         [this] { m_framesAtReady = m_frames; });
         m_picker.setReduceMotion(true);
     }
 
@@ -110,8 +115,7 @@ public:
         m_picker.present(&m_window);
         if (!waitFor([this] { return m_picker.state() != State::Starting; }) || m_picker.state() != State::Ready)
             return false;
-        const int before = m_frames;
-        if (!waitFor([&] { return m_frames > before; }))
+        if (!waitFor([this] { return m_frames > m_framesAtReady; }))
             return false;
         samples.values.push_back(milliseconds(clock));
         return true;
@@ -173,6 +177,7 @@ private:
     QQuickWindow m_window;
     FVColorPickerViewController m_picker;
     int m_frames = 0;
+    int m_framesAtReady = 0;
     int m_picks = 0;
 };
 

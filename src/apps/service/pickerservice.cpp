@@ -24,6 +24,8 @@ using namespace std::chrono_literals;
 
 /** Nobody presents for so long: then this service was started ahead of time. */
 constexpr auto quietTime = 100ms;
+/** Points; what a picker asks for when it knows nothing of its host yet. */
+constexpr QSize usualSize(360, 560);
 
 platform::TraitCollection traitCollection(const remote::Traits &traits)
 {
@@ -67,8 +69,13 @@ void PickerService::traitsDidChange(const remote::Traits &traits)
 void PickerService::warmUp()
 {
     // A service that was started ahead of time draws once for nobody: fonts, glyphs and pictures are then there.
-    if (!m_window->isVisible())
-        m_window->grabWindow();
+    if (m_window->isVisible())
+        return;
+    if (m_window->size().isEmpty()) {
+        m_window->resize(usualSize);
+        m_front->view()->setSize(usualSize);
+    }
+    m_window->grabWindow();
 }
 
 void PickerService::applySurroundings(const remote::Traits &traits)
