@@ -8,6 +8,8 @@
 
 #include <QQuickWindow>
 
+#include <utility>
+
 using favrin::host::PresentationStyle;
 using favrin::host::RemotePicker;
 
@@ -32,11 +34,13 @@ FVColorPickerViewController::Private::Private(FVColorPickerViewController &contr
                      &FVColorPickerViewController::colorPickerViewServiceDidTerminateWithError);
     QObject::connect(&picker, &RemotePicker::stateChanged, self, &FVColorPickerViewController::stateChanged);
     QObject::connect(&picker, &RemotePicker::preferredContentSizeChanged, self, [this, self](QSizeF size) {
-        preferredContentSize = size;
+        if (std::exchange(preferredContentSize, size) == size)
+            return;
         Q_EMIT self->preferredContentSizeChanged();
     });
     QObject::connect(&picker, &RemotePicker::materialChanged, self, [this, self](bool wanted) {
-        wantsMaterial = wanted;
+        if (std::exchange(wantsMaterial, wanted) == wanted)
+            return;
         Q_EMIT self->wantsMaterialChanged();
     });
     QObject::connect(&picker, &RemotePicker::surroundingsChanged, self, [self] {

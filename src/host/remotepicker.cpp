@@ -180,15 +180,18 @@ void RemotePicker::connectSession()
     connect(session, &RemoteViewSession::colorPickerDidFinish, this, &RemotePicker::serviceFinished,
             Qt::QueuedConnection);
     connect(session, &RemoteViewSession::ended, this, &RemotePicker::serviceEnded, Qt::QueuedConnection);
-    connect(session, &RemoteViewSession::preferredContentSizeDidChange, this, [this](double width, double height) {
-        m_presentation->setPreferredContentSize(QSizeF(width, height));
-        Q_EMIT preferredContentSizeChanged(QSizeF(width, height));
-    });
-    connect(session, &RemoteViewSession::backgroundEffectDidChange, this, [this](remote::BackgroundEffect effect) {
-        const bool material = effect == remote::BackgroundEffect::ThickMaterial;
-        m_presentation->setMaterial(material);
-        Q_EMIT materialChanged(material);
-    });
+    connect(session, &RemoteViewSession::preferredContentSizeDidChange, this, &RemotePicker::followService);
+    connect(session, &RemoteViewSession::backgroundEffectDidChange, this, &RemotePicker::followService);
+    followService();
+}
+
+void RemotePicker::followService()
+{
+    const bool material = m_session->backgroundEffect() == remote::BackgroundEffect::ThickMaterial;
+    m_presentation->setPreferredContentSize(m_session->preferredContentSize());
+    m_presentation->setMaterial(material);
+    Q_EMIT preferredContentSizeChanged(m_session->preferredContentSize());
+    Q_EMIT materialChanged(material);
 }
 
 void RemotePicker::connectSurroundings()

@@ -94,6 +94,7 @@ private:
     void setState(State state);
     void connectSession();
     void connectSurroundings();
+    void followService();
     void servicePrepared(quint32 serial);
     void serviceDrew();
     void serviceFinished();

@@ -66,11 +66,13 @@ public:
     void colorPickerDidFinish() override { Q_EMIT m_session.colorPickerDidFinish(); }
     void preferredContentSizeDidChange(double width, double height) override
     {
-        Q_EMIT m_session.preferredContentSizeDidChange(width, height);
+        m_session.m_preferredContentSize = QSizeF(width, height);
+        Q_EMIT m_session.preferredContentSizeDidChange();
     }
     void backgroundEffectDidChange(remote::BackgroundEffect effect) override
     {
-        Q_EMIT m_session.backgroundEffectDidChange(effect);
+        m_session.m_backgroundEffect = effect;
+        Q_EMIT m_session.backgroundEffectDidChange();
     }
     void textInputDidChange(const server::TextInputState &state) override
     {

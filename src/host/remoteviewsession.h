@@ -5,6 +5,7 @@
 
 #include <QElapsedTimer>
 #include <QObject>
+#include <QSizeF>
 
 #include <memory>
 
@@ -46,6 +47,10 @@ public:
     std::uint32_t now() const { return static_cast<std::uint32_t>(m_clock.elapsed()); }
 
     const server::TextInputState &textInput() const { return m_textInput; }
+    /** What the service said last, perhaps before anybody listened: it may have been started ahead of time. */
+    remote::BackgroundEffect backgroundEffect() const { return m_backgroundEffect; }
+    /** Points; 0 × 0 while the service has not said. */
+    QSizeF preferredContentSize() const { return m_preferredContentSize; }
 
 Q_SIGNALS:
     void ready();
@@ -58,8 +63,8 @@ Q_SIGNALS:
     void pickerDidFloatEyedropper();
     void pickerDidDismissEyedropper();
     void colorPickerDidFinish();
-    void preferredContentSizeDidChange(double width, double height);
-    void backgroundEffectDidChange(favrin::remote::BackgroundEffect effect);
+    void preferredContentSizeDidChange();
+    void backgroundEffectDidChange();
     void textInputDidChange();
     void clipboardOffered(const std::vector<std::string> &mimeTypes);
     void clipboardWanted(const std::string &mimeType, int descriptor);
@@ -81,6 +86,8 @@ private:
     std::unique_ptr<QSocketNotifier> m_notifier;
     QElapsedTimer m_clock;
     server::TextInputState m_textInput;
+    remote::BackgroundEffect m_backgroundEffect = remote::BackgroundEffect::None;
+    QSizeF m_preferredContentSize = QSizeF(0, 0);
     bool m_ready = false;
     bool m_ended = false;
 };

@@ -295,6 +295,9 @@ void RoadTest::aServiceStartedAheadIsTheOneThatIsShown()
     host.picker.present(&host.window);
     QTRY_VERIFY(host.isReady());
     QCOMPARE(servicesOf(getpid()), ahead);
+    // What it said while nobody listened counts all the same.
+    QVERIFY(host.picker.wantsMaterial());
+    QCOMPARE(host.picker.preferredContentSize().width(), 568.0);
     QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.swatch(0, 11));
     QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
     QCOMPARE(host.picks.back().color, FVColor(0, 0, 0));
