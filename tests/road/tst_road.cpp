@@ -32,6 +32,7 @@ private Q_SLOTS:
     void aServiceThatCannotRunIsReported();
     void theHostsDeathEndsTheService();
     void aServiceStartedAheadIsTheOneThatIsShown();
+    void aWideDisplayIsDrawnAndPickedInDisplayP3();
     void anAbsurdRecordLeavesASanePicker();
     void theWindowMayGoWhileThePickerIsShown();
 
@@ -301,6 +302,26 @@ void RoadTest::aServiceStartedAheadIsTheOneThatIsShown()
     QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.swatch(0, 11));
     QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
     QCOMPARE(host.picks.back().color, FVColor(0, 0, 0));
+}
+
+void RoadTest::aWideDisplayIsDrawnAndPickedInDisplayP3()
+{
+    RoadHost host;
+    host.picker.setDisplayGamut(FVColorPickerViewController::DisplayGamut::P3);
+    host.picker.setReduceMotion(true);
+    host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+    // sRGB B51A00, in Display P3.
+    const QPoint swatch = host.swatch(3, 5);
+    QTest::mouseClick(&host.window, Qt::LeftButton, {}, swatch);
+    QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+    const FVColor picked = host.picks.back().color;
+    QCOMPARE(host.picks.back().space, FVColor::displayP3Name());
+    QVERIFY(std::abs(picked.red() - 0.6521) < 0.001 && std::abs(picked.green() - 0.1721) < 0.001);
+    QCOMPARE(picked.toQColor(), QColor(0xB5, 0x1A, 0x00));
+    // The pixels hold the same numbers: the host said that it shows them as Display P3.
+    const QColor expected = QColor::fromRgbF(float(picked.red()), float(picked.green()), float(picked.blue()));
+    QTRY_COMPARE(host.window.grabWindow().pixel(swatch), expected.rgb());
 }
 
 void RoadTest::anAbsurdRecordLeavesASanePicker()
