@@ -359,17 +359,33 @@ void RoadTest::theWindowMayGoWhileThePickerIsShown()
     QCOMPARE(picker.state(), State::NotRunning);
 }
 
-/** What the test kills: a host that presents and waits. */
+void say(const QString &line)
+{
+    std::puts(qPrintable(line));
+    std::fflush(stdout);
+}
+
+/** A host in a process of its own, to be killed or watched: presents a picker and says what it hears. */
 int runAsHost(int argc, char *argv[])
 {
     QGuiApplication application(argc, argv);
     RoadHost host;
     QObject::connect(&host.picker, &FVColorPickerViewController::stateChanged, &host.window, [&host] {
-        if (host.isReady()) {
-            std::puts("ready");
-            std::fflush(stdout);
-        }
+        if (host.isReady())
+            say(QStringLiteral("ready"));
     });
+    QObject::connect(&host.picker, &FVColorPickerViewController::pickerDidSelectColor, &host.window,
+                     [](const FVColor &color, const QString &space, bool isVolatile) {
+                         say(QStringLiteral("pick %1 %2 %3 %4 %5 %6")
+                                 .arg(color.red())
+                                 .arg(color.green())
+                                 .arg(color.blue())
+                                 .arg(color.alpha())
+                                 .arg(space, isVolatile ? QStringLiteral("volatile") : QStringLiteral("final")));
+                     });
+    QObject::connect(&host.picker, &FVColorPickerViewController::colorPickerDidFinish, &host.window,
+                     [] { say(QStringLiteral("finished")); });
+    host.picker.setSelectedColor(FVColor(1, 1, 1));
     host.picker.present(&host.window);
     return QGuiApplication::exec();
 }
