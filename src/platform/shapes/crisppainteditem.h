@@ -27,7 +27,7 @@ public:
      * What the item looks like at @p devicePixelRatio, in pixels; the item's origin lies overhangPixels() inside.
      * The device pixel ratio of the image is left at 1.
      */
-    QImage render(double devicePixelRatio);
+    virtual QImage render(double devicePixelRatio);
     /** The item's size in whole pixels. */
     QSize pixelSize(double devicePixelRatio) const;
     int overhangPixels(double devicePixelRatio) const;

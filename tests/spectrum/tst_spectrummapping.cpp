@@ -1,0 +1,293 @@
+#include "spectrum/hue.h"
+#include "spectrum/spectrummapping.h"
+#include "spectrum/spectrumrenderer.h"
+#include "spectrum/timingcurve.h"
+
+#include <QTest>
+
+#include <bit>
+#include <cmath>
+#include <limits>
+
+using namespace favrin;
+using namespace favrin::spectrum;
+using model::SomeColor;
+
+namespace {
+
+constexpr float notANumber = std::numeric_limits<float>::quiet_NaN();
+constexpr double anyTolerance = 1e-5;
+
+FieldColor colorAt(double x, double y)
+{
+    const platform::Color color = SpectrumRenderer::colorAtLocation({x, y});
+    const auto components = color.components();
+    return {static_cast<float>(components[0]), static_cast<float>(components[1]), static_cast<float>(components[2]),
+            static_cast<float>(color.alpha())};
+}
+
+bool isNear(double left, double right, double tolerance)
+{
+    return std::abs(left - right) <= tolerance;
+}
+
+bool isNear(const FieldColor &left, const FieldColor &right)
+{
+    return isNear(left.r, right.r, anyTolerance) && isNear(left.g, right.g, anyTolerance) &&
+           isNear(left.b, right.b, anyTolerance) && left.a == right.a;
+}
+
+SomeColor sRGB(double r, double g, double b)
+{
+    return {r, g, b, 1.0, SomeColor::ColorSpace::sRGB};
+}
+
+/** A hash of the bits of the field at many places: one changed bit anywhere changes it. */
+quint64 bitsOfTheField()
+{
+    quint64 hash = 14695981039346656037ULL;
+    const auto feed = [&hash](float value) { hash = (hash ^ std::bit_cast<quint32>(value)) * 1099511628211ULL; };
+    for (int row = 0; row <= 200; ++row) {
+        for (int column = 0; column <= 200; ++column) {
+            const FieldColor color = colorAt(column / 100.0 - 1.0, row / 100.0 - 1.0);
+            for (const float component : {color.r, color.g, color.b})
+                feed(component);
+        }
+    }
+    return hash;
+}
+
+} // namespace
+
+class SpectrumMappingTest : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void locationHasColor_data();
+    void locationHasColor();
+    void colorIsOpaqueExtendedSRGB();
+    void fieldKeepsItsBits();
+    void edgesArePure();
+    void hueRunsOnce();
+    void angleOfColor_data();
+    void angleOfColor();
+    void positionOfColor_data();
+    void positionOfColor();
+    void positionLeadsBack();
+    void curveLeadsBack();
+    void curveEndsForAnyInput();
+    void pointHasColor_data();
+    void pointHasColor();
+    void colorHasPoint_data();
+    void colorHasPoint();
+    void pointsAreInTheView();
+};
+
+void SpectrumMappingTest::locationHasColor_data()
+{
+    QTest::addColumn<QPointF>("location");
+    QTest::addColumn<FieldColor>("color");
+    QTest::newRow("red at the top") << QPointF(0.0, 1.0) << FieldColor{1.0F, 0.0F, 0.0F};
+    QTest::newRow("cyan in the middle") << QPointF(0.0, 0.0) << FieldColor{0.0F, 1.0F, 1.0F};
+    QTest::newRow("almost red at the bottom") << QPointF(0.0, -1.0) << FieldColor{1.0F, 0.0F, 1.0F / 255.0F};
+    QTest::newRow("yellow-green") << QPointF(0.0, 0.5) << FieldColor{0.40900F, 1.0F, 0.0F};
+    QTest::newRow("violet") << QPointF(0.0, -0.5) << FieldColor{0.40900F, 0.0F, 1.0F};
+    QTest::newRow("tint") << QPointF(-0.5, 1.0) << FieldColor{1.0F, 0.60036F, 0.60036F};
+    QTest::newRow("shade") << QPointF(0.5, 1.0) << FieldColor{0.60036F, 0.0F, 0.0F};
+    QTest::newRow("negative zero is the pure hue") << QPointF(-0.0, 1.0) << FieldColor{1.0F, 0.0F, 0.0F};
+}
+
+void SpectrumMappingTest::locationHasColor()
+{
+    QFETCH(QPointF, location);
+    QFETCH(FieldColor, color);
+    QVERIFY(isNear(colorAt(location.x(), location.y()), color));
+}
+
+void SpectrumMappingTest::colorIsOpaqueExtendedSRGB()
+{
+    const platform::Color color = SpectrumRenderer::colorAtLocation({0.25, -0.6});
+    QCOMPARE(color.colorSpace(), std::optional(platform::ColorSpace::extendedSRGB()));
+    QCOMPARE(color.alpha(), 1.0);
+}
+
+void SpectrumMappingTest::fieldKeepsItsBits()
+{
+    // Taken from these very operations computed one by one in single precision by another program.
+    QCOMPARE(bitsOfTheField(), quint64(0x742dad70c90f4462));
+}
+
+void SpectrumMappingTest::edgesArePure()
+{
+    for (int i = -100; i <= 100; ++i) {
+        QCOMPARE(colorAt(-1.0, i / 100.0), (FieldColor{1.0F, 1.0F, 1.0F}));
+        QVERIFY(isNear(colorAt(1.0, i / 100.0), {0.0F, 0.0F, 0.0F}));
+    }
+}
+
+void SpectrumMappingTest::hueRunsOnce()
+{
+    float previous = -1.0F;
+    for (int i = 0; i <= 1000; ++i) {
+        const FieldColor color = hueColor(1.0F - static_cast<float>(i) / 500.0F);
+        QCOMPARE(std::max({color.r, color.g, color.b}), 1.0F);
+        QCOMPARE(std::min({color.r, color.g, color.b}), 0.0F);
+        const float angle = hueAngle(color.r, color.g, color.b);
+        QVERIFY2(angle >= previous && angle < 360.0F, qPrintable(QString::number(i)));
+        previous = angle;
+    }
+    QVERIFY(previous > 359.0F);
+}
+
+void SpectrumMappingTest::angleOfColor_data()
+{
+    QTest::addColumn<FieldColor>("color");
+    QTest::addColumn<float>("angle");
+    QTest::newRow("red") << FieldColor{1.0F, 0.0F, 0.0F} << 0.0F;
+    QTest::newRow("yellow") << FieldColor{1.0F, 1.0F, 0.0F} << 60.0F;
+    QTest::newRow("green") << FieldColor{0.0F, 0.5F, 0.0F} << 120.0F;
+    QTest::newRow("cyan") << FieldColor{0.0F, 1.0F, 1.0F} << 180.0F;
+    QTest::newRow("blue tint") << FieldColor{0.5F, 0.5F, 1.0F} << 240.0F;
+    QTest::newRow("magenta") << FieldColor{1.0F, 0.0F, 1.0F} << 300.0F;
+    QTest::newRow("gray") << FieldColor{0.5F, 0.5F, 0.5F} << notANumber;
+    QTest::newRow("not a number") << FieldColor{notANumber, notANumber, notANumber} << 0.0F;
+}
+
+void SpectrumMappingTest::angleOfColor()
+{
+    QFETCH(FieldColor, color);
+    QFETCH(float, angle);
+    const float actual = hueAngle(color.r, color.g, color.b);
+    QVERIFY(actual == angle || (std::isnan(actual) && std::isnan(angle)));
+}
+
+void SpectrumMappingTest::positionOfColor_data()
+{
+    QTest::addColumn<FieldColor>("color");
+    QTest::addColumn<QPointF>("position");
+    QTest::addColumn<double>("tolerance");
+    QTest::newRow("red, found just before the top")
+        << FieldColor{1.0F, 0.0F, 0.0F} << QPointF(0.0, 0.9990234375) << 0.0;
+    QTest::newRow("alpha is not looked at") << FieldColor{1.0F, 0.0F, 0.0F, 0.0F} << QPointF(0.0, 0.9990234375) << 0.0;
+    QTest::newRow("gray") << FieldColor{0.5F, 0.5F, 0.5F} << QPointF(0.5794, -1.0) << 5e-5;
+    QTest::newRow("white") << FieldColor{1.0F, 1.0F, 1.0F} << QPointF(-1.0, -1.0) << 0.0;
+    QTest::newRow("black") << FieldColor{0.0F, 0.0F, 0.0F} << QPointF(1.0, 0.9990234375) << 1e-5;
+    QTest::newRow("a full component makes a tint") << FieldColor{0.0F, 1.0F, 1.0F} << QPointF(0.0, 0.0) << 0.0;
+}
+
+void SpectrumMappingTest::positionOfColor()
+{
+    QFETCH(FieldColor, color);
+    QFETCH(QPointF, position);
+    QFETCH(double, tolerance);
+    const QPointF actual = SpectrumRenderer::positionForColor(color);
+    QVERIFY2(isNear(actual.x(), position.x(), tolerance), qPrintable(QString::number(actual.x(), 'g', 9)));
+    QVERIFY2(isNear(actual.y(), position.y(), tolerance), qPrintable(QString::number(actual.y(), 'g', 9)));
+}
+
+void SpectrumMappingTest::positionLeadsBack()
+{
+    // Away from the edges, where a color is one place only and its hue can be told.
+    for (int row = -98; row <= 98; ++row) {
+        for (int column = -90; column <= 90; ++column) {
+            const QPointF location(column / 100.0, row / 100.0);
+            const QPointF back = SpectrumRenderer::positionForColor(colorAt(location.x(), location.y()));
+            const FieldColor there = colorAt(location.x(), location.y());
+            const FieldColor here = colorAt(back.x(), back.y());
+            const bool same =
+                isNear(here.r, there.r, 2e-4) && isNear(here.g, there.g, 2e-4) && isNear(here.b, there.b, 2e-4);
+            QVERIFY2(same && isNear(back.x(), location.x(), 1e-3) && isNear(back.y(), location.y(), 4e-3),
+                     qPrintable(QStringLiteral("%1,%2 %3,%4")
+                                    .arg(location.x())
+                                    .arg(location.y())
+                                    .arg(back.x(), 0, 'g', 9)
+                                    .arg(back.y(), 0, 'g', 9)));
+        }
+    }
+}
+
+void SpectrumMappingTest::curveLeadsBack()
+{
+    const TimingCurve curve(0.42F, 0.1F, 0.83F, 0.95F);
+    float previous = -1.0F;
+    for (int i = 0; i <= 1000; ++i) {
+        const float x = static_cast<float>(i) / 1000.0F;
+        const float y = curve.y(x);
+        QVERIFY(y > previous);
+        QVERIFY(isNear(curve.x(y), x, 1e-4));
+        previous = y;
+    }
+    QVERIFY(isNear(curve.y(0.5F), 0.39964, 1e-5));
+}
+
+void SpectrumMappingTest::curveEndsForAnyInput()
+{
+    // The first has a vertical start, where Newton's method has nothing to divide by.
+    for (const TimingCurve &curve : {TimingCurve(0.0F, 0.5F, 1.0F, 0.5F), TimingCurve(0.47F, 0.0F, 0.68F, 1.0F)}) {
+        QVERIFY(std::isnan(curve.y(notANumber)));
+        QCOMPARE(curve.y(0.0F), 0.0F);
+        for (const float x : {-1e30F, -2.0F, 0.001F, 0.999F, 2.0F, 1e30F, std::numeric_limits<float>::infinity()})
+            curve.x(curve.y(x));
+        for (int i = 1; i < 1000; ++i)
+            QVERIFY(curve.y(static_cast<float>(i) / 1000.0F) >= curve.y(static_cast<float>(i - 1) / 1000.0F) - 1e-4F);
+    }
+}
+
+void SpectrumMappingTest::pointHasColor_data()
+{
+    QTest::addColumn<QPointF>("point");
+    QTest::addColumn<QPointF>("location");
+    QTest::newRow("top left") << QPointF(0.0, 0.0) << QPointF(-1.0, 1.0);
+    QTest::newRow("middle") << QPointF(180.0, 150.0) << QPointF(0.0, 0.0);
+    QTest::newRow("bottom right") << QPointF(360.0, 300.0) << QPointF(1.0, -1.0);
+    QTest::newRow("left of the view") << QPointF(-50.0, 75.0) << QPointF(-1.0, 0.5);
+    QTest::newRow("far outside") << QPointF(1e300, -1e300) << QPointF(1.0, 1.0);
+}
+
+void SpectrumMappingTest::pointHasColor()
+{
+    QFETCH(QPointF, point);
+    QFETCH(QPointF, location);
+    QCOMPARE(locationForPoint(point, {360.0, 300.0}), location);
+    QCOMPARE(colorForPoint(point, {360.0, 300.0}), SpectrumRenderer::colorAtLocation(location));
+}
+
+void SpectrumMappingTest::colorHasPoint_data()
+{
+    QTest::addColumn<SomeColor>("color");
+    QTest::addColumn<bool>("hasPoint");
+    QTest::newRow("mid gray") << sRGB(0.5, 0.5, 0.5) << false;
+    QTest::newRow("muted") << sRGB(0.7, 0.4, 0.2) << false;
+    QTest::newRow("white") << sRGB(1.0, 1.0, 1.0) << false;
+    QTest::newRow("almost white") << sRGB(0.9991, 0.9991, 0.9991) << false;
+    QTest::newRow("black") << sRGB(0.0, 0.0, 0.0) << false;
+    QTest::newRow("almost black") << sRGB(0.0009, 0.0, 0.0) << false;
+    QTest::newRow("at the low tolerance") << sRGB(0.001, 0.4, 0.2) << false;
+    QTest::newRow("at the high tolerance") << sRGB(0.999, 0.4, 0.2) << false;
+    QTest::newRow("tint") << sRGB(1.0, 0.6, 0.6) << true;
+    QTest::newRow("shade") << sRGB(0.6, 0.0, 0.0) << true;
+    QTest::newRow("Display P3, clipped by sRGB")
+        << SomeColor(1.0, 0.0, 0.0, 1.0, SomeColor::ColorSpace::displayP3) << true;
+}
+
+void SpectrumMappingTest::colorHasPoint()
+{
+    QFETCH(SomeColor, color);
+    QFETCH(bool, hasPoint);
+    QCOMPARE(pointForColor(color, {360.0, 300.0}).has_value(), hasPoint);
+}
+
+void SpectrumMappingTest::pointsAreInTheView()
+{
+    const QSizeF size(360.0, 300.0);
+    const auto tint = pointForColor(sRGB(1.0, 0.6, 0.6), size);
+    QVERIFY(isNear(tint->x(), 90.0, 0.1) && isNear(tint->y(), 0.0, 0.2));
+    const auto shade = pointForColor(sRGB(0.6, 0.0, 0.0), size);
+    QVERIFY(isNear(shade->x(), 270.0, 0.1) && isNear(shade->y(), 0.0, 0.2));
+    const auto blue = pointForColor(sRGB(0.0, 0.0, 1.0), size);
+    QVERIFY(isNear(blue->x(), 180.0, 0.1) && isNear(blue->y(), 200.0, 0.2));
+}
+
+QTEST_GUILESS_MAIN(SpectrumMappingTest)
+#include "tst_spectrummapping.moc"
