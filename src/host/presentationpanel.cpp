@@ -21,7 +21,7 @@ constexpr double shadowDrop = 6;
 constexpr QColor shadowColor(0, 0, 0, 64);
 constexpr double arrowHalfWidth = 13;
 /** Nothing behind the panel is blurred, so the material lets just enough through to tell that something is there. */
-constexpr double materialOpacity = 0.965;
+constexpr double materialOpacity = 0.985;
 
 QColor panelColor(bool dark)
 {
