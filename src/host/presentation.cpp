@@ -25,8 +25,8 @@ Presentation::Presentation(PresentationStyle style, QQuickItem &place, QObject *
     , m_focusBefore(place.window() ? place.window()->activeFocusItem() : nullptr)
 {
     build();
-    for (const auto signal : {&QQuickItem::widthChanged, &QQuickItem::heightChanged})
-        connect(m_parentItem, signal, this, &Presentation::layOut);
+    connect(m_parentItem, &QQuickItem::widthChanged, this, &Presentation::layOut);
+    connect(m_parentItem, &QQuickItem::heightChanged, this, &Presentation::layOut);
     connect(m_place, &QObject::destroyed, this, &Presentation::placeWasLost);
     connect(m_place, &QQuickItem::windowChanged, this, &Presentation::placeWasLost);
     layOut();

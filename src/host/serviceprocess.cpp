@@ -130,6 +130,7 @@ QString ServiceProcess::start(int socket)
     const QByteArray path = QFile::encodeName(program());
     auto variables = serviceEnvironment();
     std::vector<char *> environment;
+    environment.reserve(variables.size() + 1);
     for (auto &variable : variables)
         environment.push_back(variable.data());
     environment.push_back(nullptr);

@@ -15,7 +15,6 @@ Item {
         font.family: Style.family
         horizontalAlignment: Text.AlignLeft
         textFormat: Text.PlainText
-        x: 44 * lettering.unit
     }
 
     // Letters stay where they are printed, whichever way the app reads.
@@ -30,6 +29,7 @@ Item {
         font.weight: Font.Black
         lineHeight: 0.84
         text: qsTr("Lakeside\nNights")
+        x: 44 * lettering.unit
         y: 26 * lettering.unit
 
         TapHandler {
@@ -43,6 +43,7 @@ Item {
         font.pixelSize: Math.max(1, Math.round(27 * lettering.unit))
         font.weight: Font.DemiBold
         text: qsTr("Chamber music\nby the water")
+        x: 44 * lettering.unit
         y: 706 * lettering.unit
     }
     Line {
@@ -53,6 +54,7 @@ Item {
         lineHeight: 1.25
         text: qsTr("12 – 21 June\nEvery evening at eight\nBoathouse stage")
         width: (600 - 88) * lettering.unit
+        x: 44 * lettering.unit
         y: 708 * lettering.unit
     }
 }

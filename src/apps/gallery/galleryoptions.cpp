@@ -6,14 +6,17 @@ namespace favrin::gallery {
 
 namespace {
 
-const QString defaultTourFolder = QStringLiteral("build/tour");
+QString defaultTourFolder()
+{
+    return QStringLiteral("build/tour");
+}
 
 /** The parser knows options with a value and without one, but not "--tour" beside "--tour=DIR". */
 QStringList withTourFolder(QStringList arguments)
 {
     for (QString &argument : arguments) {
         if (argument == QStringLiteral("--tour"))
-            argument += u'=' + defaultTourFolder;
+            argument += u'=' + defaultTourFolder();
     }
     return arguments;
 }
@@ -26,7 +29,7 @@ ParsedOptions parseOptions(const QStringList &arguments)
     const QCommandLineOption tour(QStringLiteral("tour"),
                                   QStringLiteral("Plays a tour by itself and leaves pictures and the list of picks in "
                                                  "DIR, %1 unless given.")
-                                      .arg(defaultTourFolder),
+                                      .arg(defaultTourFolder()),
                                   QStringLiteral("DIR"));
     const QCommandLineOption onlyScaled(QStringLiteral("only-scaled-picture"),
                                         QStringLiteral("Of the tour, takes only the picture of a scaled window."));

@@ -8,7 +8,7 @@
 namespace favrin::gallery {
 
 /** One part of the poster: the sheet's outline of it scaled to the item, which also says where it can be touched. */
-class PosterShape : public platform::CrispPaintedItem
+class PosterShape : public favrin::platform::CrispPaintedItem
 {
     Q_OBJECT
     QML_ELEMENT

@@ -7,7 +7,7 @@
 namespace favrin::gallery {
 
 /** The soft shadow of a sheet of paper that lies on the desk. */
-class SheetShadow : public platform::CrispPaintedItem
+class SheetShadow : public favrin::platform::CrispPaintedItem
 {
     Q_OBJECT
     QML_ELEMENT
