@@ -1,0 +1,63 @@
+import QtQuick
+import QtQuick.Templates as T
+import Favrin.Sliders
+import Favrin.Theme
+
+/* One choice of the color space menu. */
+T.MenuItem {
+    id: item
+
+    required property bool isCurrent
+    required property real sidePadding
+
+    hoverEnabled: true
+
+    Accessible.role: Accessible.RadioButton
+    Accessible.name: text
+    Accessible.checkable: true
+    Accessible.checked: isCurrent
+    Accessible.onPressAction: item.triggered()
+
+    Item {
+        anchors.fill: parent
+        Text {
+            anchors.left: parent.left
+            anchors.right: mark.left
+            anchors.margins: item.sidePadding
+            anchors.verticalCenter: parent.verticalCenter
+            text: item.text
+            textFormat: Text.PlainText
+            elide: Text.ElideRight
+            font: Theme.bodyFont
+            color: Theme.label
+        }
+
+        CheckMark {
+            id: mark
+
+            anchors.right: parent.right
+            anchors.rightMargin: item.sidePadding
+            anchors.verticalCenter: parent.verticalCenter
+            width: Theme.bodyFont.pixelSize * 0.8
+            height: width
+            color: Theme.tint
+            visible: item.isCurrent
+        }
+    }
+
+    background: Item {
+        Rectangle {
+            width: parent.width
+            height: 1
+            color: Theme.separator
+        }
+
+        Rectangle {
+            anchors.fill: parent
+            anchors.margins: 3
+            radius: 5
+            color: Theme.fill
+            visible: item.highlighted || item.hovered || item.down
+        }
+    }
+}
