@@ -39,7 +39,8 @@ inline float lit(float component, float base, float factor)
 
 inline std::uint32_t byte(float component)
 {
-    // By way of int, which the vector units convert to.
+    // By way of int, which the vector units convert to; a component lies in 0…1, so that adding a half rounds it.
+    // NOLINTNEXTLINE(bugprone-incorrect-roundings)
     return static_cast<std::uint32_t>(static_cast<std::int32_t>(component * 255.0F + 0.5F));
 }
 

@@ -37,7 +37,7 @@ private:
 class CpuFunction : public Function
 {
 public:
-    CpuFunction(CpuVertexFunction function) : m_name(function.name), m_vertex(function.shade) {}
+    explicit CpuFunction(CpuVertexFunction function) : m_name(function.name), m_vertex(function.shade) {}
     CpuFunction(CpuFragmentFunction function, std::span<const std::uint32_t> constants)
         : m_name(function.name), m_fragment(function.shade), m_constants(constants.begin(), constants.end())
     {
