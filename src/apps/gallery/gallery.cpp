@@ -8,7 +8,7 @@ using Kind = MessageLog::Kind;
 Gallery::Gallery(QObject *parent) : QObject(parent), m_presenter(&m_picker)
 {
     m_picker.setAppearance(Picker::Appearance::Light);
-    m_picker.setSuggestedColors(m_poster.fills());
+    m_picker.setSuggestedColors(m_poster.colors());
     connectPoster();
     connectMessages();
     showSelectedPart();
@@ -71,7 +71,7 @@ void Gallery::takePick(const FVColor &color, const QString &colorspace, bool isV
     m_messages.addPick(color, colorspace, isVolatile);
     m_poster.setSelectedFill(color);
     if (!isVolatile)
-        m_picker.setSuggestedColors(m_poster.fills());
+        m_picker.setSuggestedColors(m_poster.colors());
 }
 
 } // namespace favrin::gallery

@@ -72,6 +72,10 @@ void PickerPresenter::start()
 
 void PickerPresenter::ended()
 {
+    // Said by a presentation that another one has followed already.
+    if (m_picker->isPresented())
+        return;
+    FVColorPickerViewController::startServiceAhead();
     if (m_switching) {
         m_switching = false;
         start();

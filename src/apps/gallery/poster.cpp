@@ -45,6 +45,13 @@ QHash<int, QByteArray> Poster::roleNames() const
     return {{PartRole, "part"}, {NameRole, "name"}, {ColorRole, "color"}};
 }
 
+QList<FVColor> Poster::colors() const
+{
+    QList<FVColor> colors(m_fills.begin(), m_fills.end());
+    colors.removeIf([](const FVColor &color) { return !color.isValid(); });
+    return colors;
+}
+
 void Poster::setSelectedFill(const FVColor &fill)
 {
     if (fill == selectedFill())

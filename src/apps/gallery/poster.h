@@ -39,7 +39,8 @@ public:
 
     /** The fill as the picker gave it; no color leaves the part out. */
     FVColor fill(Part part) const { return m_fills[static_cast<std::size_t>(part)]; }
-    QList<FVColor> fills() const { return {m_fills.begin(), m_fills.end()}; }
+    /** Every fill that is a color. */
+    QList<FVColor> colors() const;
     FVColor selectedFill() const { return fill(m_selectedPart); }
     void setSelectedFill(const FVColor &fill);
 
