@@ -12,7 +12,7 @@ import time
 import gi
 
 gi.require_version("Atspi", "2.0")
-from gi.repository import Atspi  # noqa: E402
+from gi.repository import Atspi, GLib  # noqa: E402
 
 SERVICE = "favrin-color-picker-service"
 PATIENCE_SECONDS = 20
@@ -122,7 +122,11 @@ def read_and_use(host):
 
     close = [node for node in nodes(application, Atspi.Role.PUSH_BUTTON) if node.get_name() == "Close"]
     check(len(close) == 1, "there is one close button")
-    press(close[0])
+    try:
+        press(close[0])
+    except GLib.Error:
+        # The picker may be gone before it can answer; the host's word below is what counts.
+        pass
     wait_for("the close button ends the presentation", lambda: host.said("finished"))
     print("PASS: the close button ends the presentation")
 
