@@ -129,7 +129,7 @@ public:
 
     bool drag(Samples &messages, Samples &frames)
     {
-        const auto origin = m_picker.view()->mapToScene(QPointF(42, 77));
+        const auto origin = m_picker.view()->mapToScene(QPointF(42, 129));
         send(QEvent::MouseButtonPress, origin);
         for (int step = 1; step <= dragSteps; ++step) {
             settle();

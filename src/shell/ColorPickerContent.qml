@@ -1,6 +1,7 @@
 import QtQuick
 import Favrin.Grid
 import Favrin.Service
+import Favrin.Spectrum
 import Favrin.Theme
 
 /* The area of the current tab. */
@@ -10,6 +11,7 @@ Item {
     required property ColorPickerState colorPickerState
 
     readonly property real aspectRatio: 1.2
+    readonly property bool showsSpectrum: colorPickerState.selectedTab === "Spectrum"
 
     implicitHeight: width / aspectRatio
 
@@ -17,12 +19,35 @@ Item {
         id: grid
 
         anchors.fill: parent
+        visible: !content.showsSpectrum
         colorPickerState: content.colorPickerState
         Accessible.role: Accessible.List
 
         FocusRing {
             parentRadius: grid.cornerRadius
             visible: grid.focusVisible
+        }
+    }
+
+    // Made when it is to be seen first, since nobody should wait for it at the start; then kept, so that a drag which
+    // another tab cuts off is ended by the item that began it.
+    Loader {
+        anchors.fill: parent
+        active: false
+        visible: content.showsSpectrum
+        onVisibleChanged: active = active || visible
+        Component.onCompleted: active = visible
+
+        sourceComponent: Spectrum {
+            id: spectrum
+
+            colorPickerState: content.colorPickerState
+            Accessible.role: Accessible.ColorChooser
+
+            FocusRing {
+                parentRadius: spectrum.cornerRadius
+                visible: spectrum.focusVisible
+            }
         }
     }
 }

@@ -11,6 +11,7 @@ Flickable {
     readonly property real horizontalPadding: colorPickerState.useLandscapeLayout ? 20 : 16
     readonly property real innerWidth: Math.max(contentWidth - 2 * horizontalPadding, 0)
     readonly property real bottomPadding: colorPickerState.useLandscapeLayout ? 20 : 16
+    readonly property real spacing: colorPickerState.useLandscapeLayout ? 16 : 20
     readonly property bool fits: contentHeight <= height
 
     implicitWidth: contentWidth
@@ -38,11 +39,20 @@ Flickable {
         colorPickerState: root.colorPickerState
     }
 
+    ColorPickerTabPicker {
+        id: tabPicker
+
+        x: root.horizontalPadding
+        y: bar.height
+        width: root.innerWidth
+        colorPickerState: root.colorPickerState
+    }
+
     ColorPickerContent {
         id: content
 
         x: root.horizontalPadding
-        y: bar.height
+        y: tabPicker.y + tabPicker.height + root.spacing
         width: root.innerWidth
         colorPickerState: root.colorPickerState
     }

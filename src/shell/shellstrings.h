@@ -13,9 +13,11 @@ class ShellStrings : public QObject
     QML_ELEMENT
     QML_SINGLETON
     Q_PROPERTY(QString close READ close CONSTANT FINAL)
+    Q_PROPERTY(QString colorPickerType READ colorPickerType CONSTANT FINAL)
 
 public:
     QString close() const;
+    QString colorPickerType() const;
 };
 
 } // namespace favrin::shell

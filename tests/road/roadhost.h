@@ -44,7 +44,9 @@ public:
         const auto *view = picker.view();
         const double padding = view->width() > 500 ? 20 : 16;
         const double width = view->width() - 2 * padding;
-        const QPointF inView(padding + (column + 0.5) * width / 12, 55 + (row + 0.5) * (width / 1.2) / 10);
+        // Below the navigation bar, the tab picker and the space between.
+        const double top = 55 + 32 + (view->width() > 500 ? 16 : 20);
+        const QPointF inView(padding + (column + 0.5) * width / 12, top + (row + 0.5) * (width / 1.2) / 10);
         return view->mapToScene(inView).toPoint();
     }
     QPoint closeButton() const

@@ -1,5 +1,6 @@
 #include "grid/colorswatchpickerview.h"
 #include "shell/colorpickerviewfactory.h"
+#include "spectrum/spectrum.h"
 #include "theme/theme.h"
 
 #include <QAccessible>
@@ -8,6 +9,7 @@
 #include <QTest>
 
 using namespace favrin;
+using service::Tab;
 
 namespace {
 
@@ -33,13 +35,33 @@ public:
     bool isReady() { return view && QTest::qWaitForWindowActive(&window); }
 
     grid::ColorSwatchPickerView *grid() const { return view->findChild<grid::ColorSwatchPickerView *>(); }
+    /** Null while another tab is shown. */
+    spectrum::Spectrum *spectrum() const { return itemBelow<spectrum::Spectrum>(view.get()); }
+
+    /** Whatever is made later is a child in the scene only. */
+    template<class Item>
+    static Item *itemBelow(QQuickItem *root)
+    {
+        const QList<QQuickItem *> children = root->childItems();
+        for (QQuickItem *child : children) {
+            auto *item = qobject_cast<Item *>(child);
+            if (item || (item = itemBelow<Item>(child)))
+                return item;
+        }
+        return nullptr;
+    }
 
     /** The first item below the root that assistive technologies call @p name. */
-    QAccessibleInterface *accessible(const QString &name) const
+    QAccessibleInterface *accessible(const QString &name) const { return accessibleBelow(view.get(), name); }
+
+    static QAccessibleInterface *accessibleBelow(const QQuickItem *root, const QString &name)
     {
-        for (QQuickItem *item : view->findChildren<QQuickItem *>()) {
-            QAccessibleInterface *interface = QAccessible::queryAccessibleInterface(item);
+        const QList<QQuickItem *> children = root->childItems();
+        for (QQuickItem *child : children) {
+            QAccessibleInterface *interface = QAccessible::queryAccessibleInterface(child);
             if (interface && interface->text(QAccessible::Name) == name)
+                return interface;
+            if ((interface = accessibleBelow(child, name)))
                 return interface;
         }
         return nullptr;
@@ -78,7 +100,13 @@ private Q_SLOTS:
     void longTitleStaysBetweenTheButtons();
     void titleIsPlainText();
     void mirroredExceptTheGrid();
-    void tabStopsAreCloseButtonAndGrid();
+    void tabStopsAreCloseButtonTabPickerAndContent();
+    void everyWayOfSelectingATabSelectsIt_data();
+    void everyWayOfSelectingATabSelectsIt();
+    void tabOfTheStateIsShown();
+    void arrowsFollowTheDirection_data();
+    void arrowsFollowTheDirection();
+    void selectingAnotherTabEndsADrag();
 };
 
 void ColorPickerViewTest::contentIsLaidOut_data()
@@ -86,8 +114,8 @@ void ColorPickerViewTest::contentIsLaidOut_data()
     QTest::addColumn<bool>("landscape");
     QTest::addColumn<QRectF>("gridArea");
     QTest::addColumn<double>("bottomPadding");
-    QTest::newRow("portrait") << false << QRectF(16.0, 55.0, 328.0, 328.0 / 1.2) << 16.0;
-    QTest::newRow("landscape") << true << QRectF(20.0, 55.0, 320.0, 320.0 / 1.2) << 20.0;
+    QTest::newRow("portrait") << false << QRectF(16.0, 107.0, 328.0, 328.0 / 1.2) << 16.0;
+    QTest::newRow("landscape") << true << QRectF(20.0, 103.0, 320.0, 320.0 / 1.2) << 20.0;
 }
 
 void ColorPickerViewTest::contentIsLaidOut()
@@ -208,7 +236,7 @@ void ColorPickerViewTest::mirroredExceptTheGrid()
     QCOMPARE(picker.grid()->markedCell(), std::optional(grid::CellPosition{1, 0}));
 }
 
-void ColorPickerViewTest::tabStopsAreCloseButtonAndGrid()
+void ColorPickerViewTest::tabStopsAreCloseButtonTabPickerAndContent()
 {
     PickerWindow picker;
     QVERIFY(picker.isReady());
@@ -216,9 +244,106 @@ void ColorPickerViewTest::tabStopsAreCloseButtonAndGrid()
     QTest::keyClick(&picker.window, Qt::Key_Tab);
     QVERIFY(button->hasActiveFocus());
     QTest::keyClick(&picker.window, Qt::Key_Tab);
+    QVERIFY(picker.item(QStringLiteral("Color Picker Type"))->hasActiveFocus());
+    QTest::keyClick(&picker.window, Qt::Key_Tab);
     QVERIFY(picker.grid()->hasActiveFocus());
     QTest::keyClick(&picker.window, Qt::Key_Tab);
     QVERIFY(button->hasActiveFocus());
+    picker.state.selectedTab.set(Tab::spectrum);
+    QTest::keyClick(&picker.window, Qt::Key_Tab);
+    QTest::keyClick(&picker.window, Qt::Key_Tab);
+    QVERIFY(picker.spectrum()->hasActiveFocus());
+    QVERIFY(picker.spectrum()->focusVisible());
+}
+
+void ColorPickerViewTest::everyWayOfSelectingATabSelectsIt_data()
+{
+    QTest::addColumn<QString>("way");
+    for (const char *way : {"click", "touch", "arrow", "assistive technology"})
+        QTest::newRow(way) << QString::fromLatin1(way);
+}
+
+void ColorPickerViewTest::everyWayOfSelectingATabSelectsIt()
+{
+    QFETCH(QString, way);
+    PickerWindow picker;
+    QVERIFY(picker.isReady());
+    QVERIFY(!picker.spectrum());
+    const QRectF area = PickerWindow::inWindow(picker.grid());
+    const QPoint center = PickerWindow::inWindow(picker.item(QStringLiteral("Spectrum"))).center().toPoint();
+    if (way == u"click") {
+        QTest::mouseClick(&picker.window, Qt::LeftButton, {}, center);
+    } else if (way == u"touch") {
+        std::unique_ptr<QPointingDevice> touch(QTest::createTouchDevice());
+        QTest::touchEvent(&picker.window, touch.get()).press(0, center);
+        QTest::touchEvent(&picker.window, touch.get()).release(0, center);
+    } else if (way == u"arrow") {
+        picker.item(QStringLiteral("Color Picker Type"))->forceActiveFocus();
+        QTest::keyClick(&picker.window, Qt::Key_Right);
+    } else {
+        picker.accessible(QStringLiteral("Spectrum"))
+            ->actionInterface()
+            ->doAction(QAccessibleActionInterface::pressAction());
+    }
+    QCOMPARE(picker.state.selectedTab(), Tab::spectrum);
+    QVERIFY(picker.spectrum());
+    QVERIFY(!picker.spectrum()->hasActiveFocus());
+    QCOMPARE(PickerWindow::inWindow(picker.spectrum()), area);
+    QVERIFY(!picker.grid()->isVisible());
+    QVERIFY(picker.accessible(QStringLiteral("Color Spectrum")));
+}
+
+void ColorPickerViewTest::tabOfTheStateIsShown()
+{
+    PickerWindow picker;
+    QVERIFY(picker.isReady());
+    const auto isChecked = [&](const QString &name) { return picker.accessible(name)->state().checked; };
+    QVERIFY(!isChecked(QStringLiteral("Spectrum")));
+    picker.state.selectedTab.set(Tab::spectrum);
+    QVERIFY(isChecked(QStringLiteral("Spectrum")));
+    QCOMPARE(picker.accessible(QStringLiteral("Spectrum"))->role(), QAccessible::PageTab);
+    picker.state.selectedTab.set(Tab::grid);
+    QVERIFY(!isChecked(QStringLiteral("Spectrum")));
+    QVERIFY(picker.grid()->isVisible());
+}
+
+void ColorPickerViewTest::arrowsFollowTheDirection_data()
+{
+    QTest::addColumn<bool>("mirrored");
+    QTest::newRow("left to right") << false;
+    QTest::newRow("right to left") << true;
+}
+
+void ColorPickerViewTest::arrowsFollowTheDirection()
+{
+    QFETCH(bool, mirrored);
+    theme::Theme::instance().setLayoutDirection(mirrored ? Qt::RightToLeft : Qt::LeftToRight);
+    PickerWindow picker;
+    QVERIFY(picker.isReady());
+    const QRectF second = PickerWindow::inWindow(picker.item(QStringLiteral("Spectrum")));
+    QCOMPARE(second.left() < 180.0, mirrored);
+    picker.item(QStringLiteral("Color Picker Type"))->forceActiveFocus();
+    const Qt::Key forward = mirrored ? Qt::Key_Left : Qt::Key_Right;
+    const Qt::Key back = mirrored ? Qt::Key_Right : Qt::Key_Left;
+    QTest::keyClick(&picker.window, back);
+    QCOMPARE(picker.state.selectedTab(), Tab::grid);
+    QTest::keyClick(&picker.window, forward);
+    QCOMPARE(picker.state.selectedTab(), Tab::spectrum);
+    QTest::keyClick(&picker.window, back);
+    QCOMPARE(picker.state.selectedTab(), Tab::grid);
+}
+
+void ColorPickerViewTest::selectingAnotherTabEndsADrag()
+{
+    PickerWindow picker;
+    QVERIFY(picker.isReady());
+    picker.state.selectedTab.set(Tab::spectrum);
+    QTest::mousePress(&picker.window, Qt::LeftButton, {}, PickerWindow::inWindow(picker.spectrum()).center().toPoint());
+    QVERIFY(picker.state.isVolatile());
+    picker.state.selectedTab.set(Tab::grid);
+    QVERIFY(!picker.state.isVolatile());
+    QTest::mouseRelease(&picker.window, Qt::LeftButton, {}, QPoint(180, 200));
+    QVERIFY(!picker.state.isVolatile());
 }
 
 QTEST_MAIN(ColorPickerViewTest)

@@ -1,0 +1,55 @@
+#include "shell/tabsegments.h"
+
+#include <algorithm>
+
+namespace favrin::shell {
+
+using service::ColorPickerState;
+using service::Tab;
+
+namespace {
+
+/** The tabs that have a view. */
+constexpr std::array offeredTabs = {Tab::grid, Tab::spectrum};
+
+} // namespace
+
+void TabSegments::setColorPickerState(ColorPickerState *state)
+{
+    if (state == m_state)
+        return;
+    if (m_state)
+        m_state->disconnect(this);
+    m_state = state;
+    if (state)
+        connect(state, &ColorPickerState::selectedTabChanged, this, &TabSegments::currentChanged);
+    Q_EMIT colorPickerStateChanged();
+    Q_EMIT currentChanged();
+}
+
+QStringList TabSegments::titles() const
+{
+    QStringList titles;
+    for (const Tab tab : offeredTabs)
+        titles.append(QString::fromStdString(service::localizedTitle(tab)));
+    return titles;
+}
+
+int TabSegments::current() const
+{
+    if (!m_state)
+        return 0;
+    const auto found = std::ranges::find(offeredTabs, m_state->selectedTab());
+    return found == offeredTabs.end() ? 0 : static_cast<int>(found - offeredTabs.begin());
+}
+
+void TabSegments::setCurrent(int position)
+{
+    if (!m_state || position < 0 || position >= static_cast<int>(offeredTabs.size()))
+        return;
+    const Tab tab = offeredTabs[static_cast<std::size_t>(position)];
+    if (tab != m_state->selectedTab())
+        m_state->selectedTab.set(tab);
+}
+
+} // namespace favrin::shell
