@@ -9,100 +9,79 @@ layout(constant_id = 0) const uint surfaceColorSpace = 0;
 layout(location = 0) in vec2 fieldLocation;
 layout(location = 0) out vec4 color;
 
-// A cubic Bezier curve from (0, 0) to (1, 1): the coefficients (c, b, a) of ((a t + b) t + c) t for x and for y.
-struct TimingCurve { vec3 x; vec3 y; };
+// Two cubic Bezier curves from (0, 0) to (1, 1), solved side by side: x holds what belongs to the ramp of a component
+// within a sixth of the hues, y what belongs to the lightness. A coordinate is ((a t + b) t + c) t.
+struct Polynomials { vec2 c; vec2 b; vec2 a; };
 
-vec3 polynomial(float p1, float p2)
+Polynomials polynomials(vec2 p1, vec2 p2)
 {
-    precise float c = 3.0 * p1;
-    precise float b = 3.0 * (p2 - p1) - c;
-    precise float a = 1.0 - c - b;
-    return vec3(c, b, a);
+    precise vec2 c = 3.0 * p1;
+    precise vec2 b = 3.0 * (p2 - p1) - c;
+    precise vec2 a = 1.0 - c - b;
+    return Polynomials(c, b, a);
 }
 
-TimingCurve timingCurve(vec2 p1, vec2 p2)
+vec2 value(Polynomials p, vec2 t)
 {
-    return TimingCurve(polynomial(p1.x, p2.x), polynomial(p1.y, p2.y));
-}
-
-float value(vec3 p, float t)
-{
-    precise float result = ((p.z * t + p.y) * t + p.x) * t;
+    precise vec2 result = ((p.a * t + p.b) * t + p.c) * t;
     return result;
 }
 
-float slope(vec3 p, float t)
+vec2 slope(Polynomials p, vec2 t)
 {
-    precise float result = (3.0 * p.z * t + 2.0 * p.y) * t + p.x;
+    precise vec2 result = (3.0 * p.a * t + 2.0 * p.b) * t + p.c;
     return result;
 }
 
-// The parameter at which the polynomial has the value x: by Newton's method, or by halving where that fails.
-float parameter(vec3 p, float x)
+// The y of both curves at x. Newton's method, kept at the first value near enough; for these two curves that takes three
+// rounds at most, so that nothing need be decided pixel by pixel.
+vec2 curves(vec2 x)
 {
-    float t = x;
-    for (int round = 0; round < 8; ++round) {
-        precise float error = value(p, t) - x;
-        if (abs(error) < 1e-5)
-            return t;
-        float d = slope(p, t);
-        if (abs(d) < 1e-6)
-            break;
-        t = t - error / d;
+    const Polynomials px = polynomials(vec2(0.47, 0.42), vec2(0.68, 0.83));
+    const Polynomials py = polynomials(vec2(0.0, 0.1), vec2(1.0, 0.95));
+    vec2 t = x;
+    for (int round = 0; round < 3; ++round) {
+        precise vec2 error = value(px, t) - x;
+        precise vec2 next = t - error / slope(px, t);
+        t = mix(t, next, greaterThanEqual(abs(error), vec2(1e-5)));
     }
-    if (x < 0.0)
-        return 0.0;
-    if (x > 1.0)
-        return 1.0;
-    float low = 0.0;
-    float high = 1.0;
-    t = x;
-    for (int round = 0; round < 1024 && low < high; ++round) {
-        precise float error = value(p, t) - x;
-        if (abs(error) < 1e-5)
-            break;
-        if (error < 0.0)
-            low = t;
-        else
-            high = t;
-        t = low + (high - low) * 0.5;
-    }
-    return t;
+    return value(py, t);
 }
 
-float curve(TimingCurve c, float x)
-{
-    return value(c.y, parameter(c.x, x));
-}
-
-vec3 hueColor(float y)
+// The six sixths of the hues from the top: red, yellow, green, cyan, blue, magenta and red again.
+int segmentOf(float h)
 {
     const float sixth = 1.0 / 6.0;
-    precise float h = 0.5 - 0.5 * y;
-    int segment = 0;
-    for (int k = 1; k < 6; ++k)
-        segment += h < float(k) * sixth ? 0 : 1;
+    return int(h >= sixth) + int(h >= 2.0 * sixth) + int(h >= 3.0 * sixth) + int(h >= 4.0 * sixth) +
+           int(h >= 5.0 * sixth);
+}
+
+// Where a sixth stands on the ramp, which alternately rises and falls.
+float rampPlace(float h, int segment)
+{
     precise float t = 6.0 * h - float(segment);
-    if ((segment & 1) == 1)
-        t = 1.0 - t;
-    float u = curve(timingCurve(vec2(0.47, 0.0), vec2(0.68, 1.0)), t);
-    switch (segment) {
-    case 0: return vec3(1.0, u, 0.0);
-    case 1: return vec3(u, 1.0, 0.0);
-    case 2: return vec3(0.0, 1.0, u);
-    case 3: return vec3(0.0, u, 1.0);
-    case 4: return vec3(u, 0.0, 1.0);
-    }
-    return vec3(1.0, 0.0, max(u, 1.0 / 255.0));
+    return (segment & 1) == 1 ? 1.0 - t : t;
+}
+
+// u is the component that rises or falls.
+vec3 hueColor(int segment, float u)
+{
+    float lastBlue = max(u, 1.0 / 255.0);
+    return vec3(segment == 0 || segment == 5 ? 1.0 : (segment == 1 || segment == 4 ? u : 0.0),
+                segment == 1 || segment == 2 ? 1.0 : (segment == 0 || segment == 3 ? u : 0.0),
+                segment == 3 || segment == 4 ? 1.0 : (segment == 2 ? u : (segment == 5 ? lastBlue : 0.0)));
 }
 
 vec3 fieldColor(vec2 location)
 {
-    vec3 hue = hueColor(location.y);
+    precise float h = 0.5 - 0.5 * location.y;
+    int segment = segmentOf(h);
+    float place = rampPlace(h, segment);
     float distance = abs(location.x);
-    float k = curve(timingCurve(vec2(0.42, 0.1), vec2(0.83, 0.95)), location.x < 0.0 ? 1.0 - distance : distance);
-    precise vec3 tint = 1.0 + (hue - 1.0) * k;
-    precise vec3 shade = hue * (1.0 - k);
+    vec2 y = curves(vec2(place, location.x < 0.0 ? 1.0 - distance : distance));
+    vec3 hue = hueColor(segment, y.x);
+    precise vec3 tint = 1.0 + (hue - 1.0) * y.y;
+    precise vec3 shade = hue * (1.0 - y.y);
     return location.x < 0.0 ? tint : shade;
 }
 

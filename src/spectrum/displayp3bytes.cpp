@@ -11,7 +11,7 @@ DisplayP3Bytes::DisplayP3Bytes()
         unit[column] = 1.0;
         const platform::Triple converted = platform::linearSRGBToLinearDisplayP3(unit);
         for (std::size_t row = 0; row < m_rows.size(); ++row)
-            m_rows[row][column] = static_cast<float>(converted[row]);
+            m_rows[row][column] = static_cast<float>(converted[row] * encodedCount);
     }
     for (std::size_t i = 0; i < m_decoded.size(); ++i)
         m_decoded[i] = static_cast<float>(platform::decodedSRGB(static_cast<double>(i) / decodedCount));

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <algorithm>
 #include <array>
 #include <cstdint>
 
@@ -15,12 +16,12 @@ public:
     /** The tables of this process, made on first use. */
     static const DisplayP3Bytes &instance();
 
-    /** 0xffRRGGBB in Display P3 of an encoded sRGB color whose components lie in 0…1. */
-    std::uint32_t pixel(float r, float g, float b) const
+    /** Linear light of an encoded component that lies in 0…1. */
+    float light(float component) const { return interpolated(m_decoded, component * static_cast<float>(decodedCount)); }
+
+    /** 0xffRRGGBB in Display P3 of a color in linear sRGB whose components lie in 0…1. */
+    std::uint32_t pixel(float red, float green, float blue) const
     {
-        const float red = linear(r);
-        const float green = linear(g);
-        const float blue = linear(b);
         const auto byte = [=, this](const Row &row) { return encoded(row[0] * red + row[1] * green + row[2] * blue); };
         return 0xff000000U | (byte(m_rows[0]) << 16U) | (byte(m_rows[1]) << 8U) | byte(m_rows[2]);
     }
@@ -43,19 +44,13 @@ private:
         return entry[0] + (entry[1] - entry[0]) * (position - static_cast<float>(index));
     }
 
-    float linear(float component) const
+    std::uint32_t encoded(float position) const
     {
-        return interpolated(m_decoded, component * static_cast<float>(decodedCount));
+        const float clipped = std::min(std::max(position, 0.0F), static_cast<float>(encodedCount));
+        return static_cast<std::uint32_t>(static_cast<std::int32_t>(interpolated(m_encoded, clipped)));
     }
 
-    std::uint32_t encoded(float light) const
-    {
-        const float clipped = light < 0.0F ? 0.0F : (light > 1.0F ? 1.0F : light);
-        return static_cast<std::uint32_t>(
-            static_cast<std::int32_t>(interpolated(m_encoded, clipped * static_cast<float>(encodedCount))));
-    }
-
-    /** From linear sRGB to linear Display P3. */
+    /** From linear sRGB to the position of linear Display P3 in the table of encoded components. */
     std::array<Row, 3> m_rows = {};
 
     /** Linear light at equal steps of the encoded component. */
