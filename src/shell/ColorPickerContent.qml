@@ -1,7 +1,6 @@
 import QtQuick
 import Favrin.Grid
 import Favrin.Service
-import Favrin.Spectrum
 import Favrin.Theme
 
 /* The area of the current tab. */
@@ -32,22 +31,16 @@ Item {
     // Made when it is to be seen first, since nobody should wait for it at the start; then kept, so that a drag which
     // another tab cuts off is ended by the item that began it.
     Loader {
-        anchors.fill: parent
-        active: false
-        visible: content.showsSpectrum
-        onVisibleChanged: active = active || visible
-        Component.onCompleted: active = visible
+        id: spectrumLoader
 
-        sourceComponent: Spectrum {
-            id: spectrum
-
-            colorPickerState: content.colorPickerState
-            Accessible.role: Accessible.ColorChooser
-
-            FocusRing {
-                parentRadius: spectrum.cornerRadius
-                visible: spectrum.focusVisible
-            }
+        function load() {
+            if (visible && status === Loader.Null)
+                setSource("SpectrumTab.qml", { "colorPickerState": content.colorPickerState });
         }
+
+        anchors.fill: parent
+        visible: content.showsSpectrum
+        onVisibleChanged: load()
+        Component.onCompleted: load()
     }
 }
