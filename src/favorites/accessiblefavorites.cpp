@@ -1,0 +1,129 @@
+#include "favorites/accessiblefavorites.h"
+
+#include "favorites/accessiblefavoritecell.h"
+#include "favorites/favoritecolorpickerview.h"
+#include "favorites/favoritesstrings.h"
+
+#include <QAccessibleObject>
+#include <QQuickWindow>
+
+#include <algorithm>
+
+namespace favrin::favorites {
+namespace {
+
+class AccessibleFavorites : public QAccessibleObject
+{
+public:
+    explicit AccessibleFavorites(FavoriteColorPickerView *view) : QAccessibleObject(view)
+    {
+        // This object exists only where somebody asked for it, so there is somebody to hear.
+        QObject::connect(view, &FavoriteColorPickerView::focusFrameChanged, &m_context, [this] { announceFocus(); });
+        if (auto *cells = view->collectionView()) {
+            QObject::connect(cells, &FavoritesCollectionView::selectionChanged, &m_context, [](FavoriteCell *cell) {
+                QAccessibleEvent event(cell, QAccessible::Selection);
+                QAccessible::updateAccessibility(&event);
+            });
+        }
+    }
+
+    QWindow *window() const override { return view()->window(); }
+
+    QAccessibleInterface *parent() const override
+    {
+        for (QQuickItem *item = view()->parentItem(); item; item = item->parentItem()) {
+            if (QAccessibleInterface *interface = QAccessible::queryAccessibleInterface(item))
+                return interface;
+        }
+        return QAccessible::queryAccessibleInterface(window());
+    }
+
+    int childCount() const override { return static_cast<int>(elements().size()); }
+
+    QAccessibleInterface *child(int index) const override
+    {
+        const auto cells = elements();
+        if (index < 0 || index >= static_cast<int>(cells.size()))
+            return nullptr;
+        return QAccessible::queryAccessibleInterface(cells[static_cast<std::size_t>(index)]);
+    }
+
+    int indexOfChild(const QAccessibleInterface *child) const override
+    {
+        const auto cells = elements();
+        const auto found = std::ranges::find(cells, child->object());
+        return found != cells.end() ? static_cast<int>(found - cells.begin()) : -1;
+    }
+
+    QAccessibleInterface *childAt(int x, int y) const override
+    {
+        const auto cells = elements();
+        const auto found =
+            std::ranges::find_if(cells, [x, y](const FavoriteCell *cell) { return screenRect(*cell).contains(x, y); });
+        return found != cells.end() ? QAccessible::queryAccessibleInterface(*found) : nullptr;
+    }
+
+    QAccessibleInterface *focusChild() const override
+    {
+        const auto place = view()->focusedPlace();
+        auto *cell = view()->hasActiveFocus() && place ? view()->collectionView()->cellAt(*place) : nullptr;
+        return cell && cell->isAccessibilityElement() ? QAccessible::queryAccessibleInterface(cell) : nullptr;
+    }
+
+    QString text(QAccessible::Text kind) const override
+    {
+        return kind == QAccessible::Name ? FavoritesStrings::favorites() : QString();
+    }
+
+    QRect rect() const override { return screenRect(*view()); }
+    QAccessible::Role role() const override { return QAccessible::List; }
+
+    QAccessible::State state() const override
+    {
+        QAccessible::State state;
+        state.focusable = true;
+        state.focused = view()->hasActiveFocus();
+        state.multiSelectable = true;
+        state.invisible = !view()->isVisible();
+        return state;
+    }
+
+private:
+    FavoriteColorPickerView *view() const { return static_cast<FavoriteColorPickerView *>(object()); }
+
+    std::vector<FavoriteCell *> elements() const
+    {
+        auto cells = view()->collectionView() ? view()->collectionView()->cells() : std::vector<FavoriteCell *>();
+        std::erase_if(cells, [](const FavoriteCell *cell) { return !cell->isAccessibilityElement(); });
+        return cells;
+    }
+
+    void announceFocus() const
+    {
+        if (QAccessibleInterface *cell = focusChild()) {
+            QAccessibleEvent event(cell, QAccessible::Focus);
+            QAccessible::updateAccessibility(&event);
+        }
+    }
+
+    QObject m_context;
+};
+
+QAccessibleInterface *makeAccessible(const QString &, QObject *object)
+{
+    if (auto *view = qobject_cast<FavoriteColorPickerView *>(object))
+        return new AccessibleFavorites(view);
+    if (auto *cell = qobject_cast<FavoriteCell *>(object))
+        return new AccessibleFavoriteCell(cell);
+    return nullptr;
+}
+
+} // namespace
+
+void installAccessibleFavorites()
+{
+    // Installing the same factory again replaces nothing and adds nothing.
+    QAccessible::installFactory(makeAccessible);
+}
+
+} // namespace favrin::favorites

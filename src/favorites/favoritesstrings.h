@@ -1,0 +1,23 @@
+#pragma once
+
+#include <QObject>
+#include <QString>
+#include <QtQmlIntegration/qqmlintegration.h>
+
+namespace favrin::favorites {
+
+/** The texts of the strip, in the user's language. */
+class FavoritesStrings : public QObject
+{
+    Q_OBJECT
+    QML_ELEMENT
+    QML_SINGLETON
+    Q_PROPERTY(QString favorites READ favorites CONSTANT FINAL)
+    Q_PROPERTY(QString deleteCommand READ deleteCommand CONSTANT FINAL)
+
+public:
+    static QString favorites();
+    static QString deleteCommand();
+};
+
+} // namespace favrin::favorites
