@@ -15,6 +15,8 @@ Spectrum::Spectrum(QQuickItem *parent)
     installAccessibleSpectrum();
     m_lens->setSize({lensExtent, lensExtent});
     m_lens->setVisible(false);
+    // Over whatever is placed in the spectrum, such as a focus ring.
+    m_lens->setZ(1.0);
     setAcceptedMouseButtons(Qt::LeftButton);
     setAcceptTouchEvents(true);
     setActiveFocusOnTab(true);
