@@ -19,12 +19,9 @@ public:
     {
         // This object exists only where somebody asked for it, so there is somebody to hear.
         QObject::connect(view, &FavoriteColorPickerView::focusFrameChanged, &m_context, [this] { announceFocus(); });
-        if (auto *cells = view->collectionView()) {
-            QObject::connect(cells, &FavoritesCollectionView::selectionChanged, &m_context, [](FavoriteCell *cell) {
-                QAccessibleEvent event(cell, QAccessible::Selection);
-                QAccessible::updateAccessibility(&event);
-            });
-        }
+        // It may be asked for before the strip has its cells.
+        QObject::connect(view, &FavoriteColorPickerView::collectionViewChanged, &m_context, [this] { followCells(); });
+        followCells();
     }
 
     QWindow *window() const override { return view()->window(); }
@@ -96,6 +93,18 @@ private:
         auto cells = view()->collectionView() ? view()->collectionView()->cells() : std::vector<FavoriteCell *>();
         std::erase_if(cells, [](const FavoriteCell *cell) { return !cell->isAccessibilityElement(); });
         return cells;
+    }
+
+    void followCells()
+    {
+        if (auto *cells = view()->collectionView())
+            QObject::connect(cells, &FavoritesCollectionView::selectionChanged, &m_context, announceSelection);
+    }
+
+    static void announceSelection(FavoriteCell *cell)
+    {
+        QAccessibleEvent event(cell, QAccessible::Selection);
+        QAccessible::updateAccessibility(&event);
     }
 
     void announceFocus() const

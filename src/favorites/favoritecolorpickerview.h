@@ -61,7 +61,7 @@ public:
     /** To be told where the content is scrolled to. */
     Q_INVOKABLE void didScroll(double contentX);
     Q_INVOKABLE void movementStarted();
-    /** Where a movement comes to rest that ends at @p velocity, in points per second as the content's position changes. */
+    /** Where a movement rests that ends at @p velocity, in points per second as the content's position changes. */
     Q_INVOKABLE double restingPosition(double velocity) const;
     Q_INVOKABLE void tap(QPointF point);
     Q_INVOKABLE void showDeleteCallout(QPointF point);
