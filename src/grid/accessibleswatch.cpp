@@ -3,62 +3,42 @@
 #include "grid/colorswatchpickerview.h"
 #include "platform/queue/queue.h"
 
-#include <QQuickWindow>
-
 namespace favrin::grid {
 
 AccessibleSwatch::AccessibleSwatch(ColorSwatchPickerView &view, CellPosition cell)
-    : m_view(&view)
+    : AccessiblePart(view)
     , m_cell(cell)
     , m_description(platform::backgroundQueue(), platform::mainQueue(), [this] { announceName(); })
 {
 }
 
-bool AccessibleSwatch::isValid() const
+ColorSwatchPickerView *AccessibleSwatch::view() const
 {
-    return !m_view.isNull();
-}
-
-QWindow *AccessibleSwatch::window() const
-{
-    return m_view ? m_view->window() : nullptr;
-}
-
-QAccessibleInterface *AccessibleSwatch::parent() const
-{
-    return QAccessible::queryAccessibleInterface(m_view);
+    return static_cast<ColorSwatchPickerView *>(item());
 }
 
 QString AccessibleSwatch::text(QAccessible::Text kind) const
 {
-    if (kind != QAccessible::Name || !m_view)
+    if (kind != QAccessible::Name || !view())
         return {};
-    return QString::fromStdString(m_description.evaluate(m_view->color(m_cell)));
+    return QString::fromStdString(m_description.evaluate(view()->color(m_cell)));
 }
 
-QRect AccessibleSwatch::rect() const
+QRectF AccessibleSwatch::area() const
 {
-    return m_view ? screenRect(*m_view, m_view->cellRect(m_cell)) : QRect();
+    return view()->cellRect(m_cell);
 }
 
 QAccessible::State AccessibleSwatch::state() const
 {
-    QAccessible::State state;
-    if (!m_view) {
-        state.invalid = true;
+    QAccessible::State state = AccessiblePart::state();
+    if (!view())
         return state;
-    }
     state.selectable = true;
-    state.selected = m_view->isSelected(m_cell);
+    state.selected = view()->isSelected(m_cell);
     state.focusable = true;
-    state.focused = m_view->hasActiveFocus() && m_view->markedCell() == m_cell;
-    state.invisible = !m_view->isVisible();
+    state.focused = view()->hasActiveFocus() && view()->markedCell() == m_cell;
     return state;
-}
-
-void *AccessibleSwatch::interface_cast(QAccessible::InterfaceType type)
-{
-    return type == QAccessible::ActionInterface ? static_cast<QAccessibleActionInterface *>(this) : nullptr;
 }
 
 QStringList AccessibleSwatch::actionNames() const
@@ -68,22 +48,14 @@ QStringList AccessibleSwatch::actionNames() const
 
 void AccessibleSwatch::doAction(const QString &actionName)
 {
-    if (actionName == pressAction() && m_view && m_view->isEnabled())
-        m_view->pick(m_cell);
+    if (actionName == pressAction() && view() && view()->isEnabled())
+        view()->pick(m_cell);
 }
 
 void AccessibleSwatch::announceName()
 {
     QAccessibleEvent event(this, QAccessible::NameChanged);
     QAccessible::updateAccessibility(&event);
-}
-
-QRect screenRect(const QQuickItem &item, const QRectF &area)
-{
-    if (!item.window())
-        return {};
-    const QRectF inWindow = item.mapRectToScene(area);
-    return QRectF(item.window()->mapToGlobal(inWindow.topLeft()), inWindow.size()).toRect();
 }
 
 } // namespace favrin::grid

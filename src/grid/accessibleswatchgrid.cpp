@@ -2,9 +2,9 @@
 
 #include "grid/accessibleswatch.h"
 #include "grid/colorswatchpickerview.h"
+#include "platform/accessibility/accessibleitem.h"
 #include "platform/strings/localizedstring.h"
 
-#include <QAccessibleObject>
 #include <QQuickWindow>
 
 #include <vector>
@@ -12,11 +12,11 @@
 namespace favrin::grid {
 namespace {
 
-class AccessibleSwatchGrid : public QAccessibleObject
+class AccessibleSwatchGrid : public platform::AccessibleItem
 {
 public:
     explicit AccessibleSwatchGrid(ColorSwatchPickerView *view)
-        : QAccessibleObject(view), m_cells(static_cast<std::size_t>(gridDimensions().rows * gridDimensions().columns))
+        : AccessibleItem(view), m_cells(static_cast<std::size_t>(gridDimensions().rows * gridDimensions().columns))
     {
         m_markedCellChanged =
             QObject::connect(view, &ColorSwatchPickerView::markedCellChanged, view,
@@ -30,17 +30,6 @@ public:
             if (cell)
                 QAccessible::deleteAccessibleInterface(cell);
         }
-    }
-
-    QWindow *window() const override { return view()->window(); }
-
-    QAccessibleInterface *parent() const override
-    {
-        for (QQuickItem *item = view()->parentItem(); item; item = item->parentItem()) {
-            if (QAccessibleInterface *interface = QAccessible::queryAccessibleInterface(item))
-                return interface;
-        }
-        return QAccessible::queryAccessibleInterface(window());
     }
 
     int childCount() const override { return static_cast<int>(m_cells.size()); }
@@ -86,20 +75,10 @@ public:
         return QString::fromStdString(platform::localizedString("Grid", "Title of the tab."));
     }
 
-    QRect rect() const override { return screenRect(*view(), view()->boundingRect()); }
     QAccessible::Role role() const override { return QAccessible::List; }
 
-    QAccessible::State state() const override
-    {
-        QAccessible::State state;
-        state.focusable = true;
-        state.focused = view()->hasActiveFocus();
-        state.invisible = !view()->isVisible();
-        return state;
-    }
-
 private:
-    ColorSwatchPickerView *view() const { return static_cast<ColorSwatchPickerView *>(object()); }
+    ColorSwatchPickerView *view() const { return static_cast<ColorSwatchPickerView *>(item()); }
     static int indexOf(CellPosition cell) { return cell.row * gridDimensions().columns + cell.column; }
 
     // This object exists only where somebody asked for it, so there is somebody to hear.

@@ -34,12 +34,14 @@ QPainterPath outsideOfOutline(QSize size, double radius)
 } // namespace
 
 ColorSwatchPickerView::ColorSwatchPickerView(QQuickItem *parent)
-    : CrispPaintedItem(parent), m_marker(new ColorSwatchCrosshairView(this))
+    : CrispPaintedItem(parent)
+    , m_marker(new ColorSwatchCrosshairView(this))
+    , m_pointerDrag(
+          *this, [this](QPointF location) { drag(location); }, [this] { endDrag(); })
+    , m_focusVisibility([this] { Q_EMIT focusVisibleChanged(); })
 {
     installAccessibleSwatchGrid();
     m_marker->setVisible(false);
-    setAcceptedMouseButtons(Qt::LeftButton);
-    setAcceptTouchEvents(true);
     setActiveFocusOnTab(true);
     // Comes with a change of the surface's color space too.
     connect(&Theme::instance(), &Theme::colorsChanged, this, &ColorSwatchPickerView::updatePalette);

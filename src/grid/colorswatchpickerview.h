@@ -1,6 +1,8 @@
 #pragma once
 
 #include "grid/gridrules.h"
+#include "platform/input/focusvisibility.h"
+#include "platform/input/onepointerdrag.h"
 #include "platform/shapes/crisppainteditem.h"
 #include "service/colorpickerstate.h"
 
@@ -36,7 +38,7 @@ public:
     /** Of the four outer corners, in points. */
     double cornerRadius() const;
     /** The keyboard is here and the user is using it. */
-    bool focusVisible() const { return m_focusVisible; }
+    bool focusVisible() const { return m_focusVisibility.isVisible(); }
 
     const ColorMatrix &palette() const;
     const model::SomeColor &color(CellPosition cell) const;
@@ -58,41 +60,29 @@ protected:
     void geometryChange(const QRectF &newGeometry, const QRectF &oldGeometry) override;
     void itemChange(ItemChange change, const ItemChangeData &value) override;
 
-    void mousePressEvent(QMouseEvent *event) override;
-    void mouseMoveEvent(QMouseEvent *event) override;
-    void mouseReleaseEvent(QMouseEvent *event) override;
-    void mouseUngrabEvent() override;
-    void touchEvent(QTouchEvent *event) override;
-    void touchUngrabEvent() override;
+    void mousePressEvent(QMouseEvent *event) override { m_pointerDrag.mousePress(*event); }
+    void mouseMoveEvent(QMouseEvent *event) override { m_pointerDrag.mouseMove(*event); }
+    void mouseReleaseEvent(QMouseEvent *) override { m_pointerDrag.mouseUngrab(); }
+    void mouseUngrabEvent() override { m_pointerDrag.mouseUngrab(); }
+    void touchEvent(QTouchEvent *event) override { m_pointerDrag.touch(*event); }
+    void touchUngrabEvent() override { m_pointerDrag.touchUngrab(); }
     void keyPressEvent(QKeyEvent *event) override;
-    void focusInEvent(QFocusEvent *event) override;
-    void focusOutEvent(QFocusEvent *event) override;
+    void focusInEvent(QFocusEvent *event) override { m_focusVisibility.focusIn(*event); }
+    void focusOutEvent(QFocusEvent *event) override { m_focusVisibility.focusOut(*event); }
 
 private:
-    /** The one pointer that drags: the mouse, or a touch point by its id. */
-    struct Pointer
-    {
-        enum class Device { Mouse, Touch } device = Device::Mouse;
-        int id = 0;
-
-        bool operator==(const Pointer &) const = default;
-    };
-
     double devicePixelRatio() const;
     void updatePalette();
     void updateMarker();
     void placeMarker();
-    void beginDrag(Pointer pointer, QPointF location);
     void drag(QPointF location);
     void endDrag();
-    void handleTouchPoint(const QEventPoint &point);
-    void setFocusVisible(bool visible);
 
     QPointer<service::ColorPickerState> m_state;
     ColorSwatchCrosshairView *m_marker;
     std::optional<CellPosition> m_markedCell;
-    std::optional<Pointer> m_pointer;
-    bool m_focusVisible = false;
+    platform::OnePointerDrag m_pointerDrag;
+    platform::FocusVisibility m_focusVisibility;
 };
 
 } // namespace favrin::grid

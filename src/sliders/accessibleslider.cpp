@@ -1,10 +1,8 @@
 #include "sliders/accessibleslider.h"
 
+#include "platform/accessibility/accessibleitem.h"
 #include "sliders/cpslider.h"
 #include "sliders/sliderrules.h"
-
-#include <QAccessibleObject>
-#include <QQuickWindow>
 
 #include <algorithm>
 #include <cmath>
@@ -12,31 +10,17 @@
 namespace favrin::sliders {
 namespace {
 
-class AccessibleSlider : public QAccessibleObject, public QAccessibleValueInterface, public QAccessibleActionInterface
+class AccessibleSlider : public platform::AccessibleItem,
+                         public QAccessibleValueInterface,
+                         public QAccessibleActionInterface
 {
 public:
-    explicit AccessibleSlider(CPSlider *slider) : QAccessibleObject(slider)
+    explicit AccessibleSlider(CPSlider *slider) : AccessibleItem(slider)
     {
         m_valueChanged = QObject::connect(slider, &CPSlider::valueChanged, slider, [this] { announceValue(); });
     }
 
     ~AccessibleSlider() override { QObject::disconnect(m_valueChanged); }
-
-    QWindow *window() const override { return slider()->window(); }
-
-    QAccessibleInterface *parent() const override
-    {
-        for (QQuickItem *item = slider()->parentItem(); item; item = item->parentItem()) {
-            if (QAccessibleInterface *interface = QAccessible::queryAccessibleInterface(item))
-                return interface;
-        }
-        return QAccessible::queryAccessibleInterface(window());
-    }
-
-    int childCount() const override { return 0; }
-    QAccessibleInterface *child(int) const override { return nullptr; }
-    QAccessibleInterface *childAt(int, int) const override { return nullptr; }
-    int indexOfChild(const QAccessibleInterface *) const override { return -1; }
 
     QString text(QAccessible::Text kind) const override
     {
@@ -45,25 +29,7 @@ public:
         return kind == QAccessible::Value ? slider()->valueText() : QString();
     }
 
-    QRect rect() const override
-    {
-        if (!window())
-            return {};
-        const QRectF inWindow = slider()->mapRectToScene(slider()->boundingRect());
-        return QRectF(window()->mapToGlobal(inWindow.topLeft()), inWindow.size()).toRect();
-    }
-
     QAccessible::Role role() const override { return QAccessible::Slider; }
-
-    QAccessible::State state() const override
-    {
-        QAccessible::State state;
-        state.focusable = true;
-        state.focused = slider()->hasActiveFocus();
-        state.invisible = !slider()->isVisible();
-        state.disabled = !slider()->isEnabled();
-        return state;
-    }
 
     void *interface_cast(QAccessible::InterfaceType type) override
     {
@@ -98,7 +64,7 @@ public:
     }
 
 private:
-    CPSlider *slider() const { return static_cast<CPSlider *>(object()); }
+    CPSlider *slider() const { return static_cast<CPSlider *>(item()); }
     double scale() const { return shownSteps(component(slider()->component())); }
 
     void write(double value)

@@ -11,12 +11,14 @@ namespace favrin::sliders {
 using service::ColorPickerState;
 using theme::Theme;
 
-CPSlider::CPSlider(QQuickItem *parent) : QQuickItem(parent)
+CPSlider::CPSlider(QQuickItem *parent)
+    : QQuickItem(parent)
+    , m_pointerDrag(
+          *this, [this](QPointF location) { drag(location); }, [this] { endDrag(); })
+    , m_focusVisibility([this] { Q_EMIT focusVisibleChanged(); })
 {
     installAccessibleSlider();
     setImplicitHeight(trackHeight);
-    setAcceptedMouseButtons(Qt::LeftButton);
-    setAcceptTouchEvents(true);
     setActiveFocusOnTab(true);
     connect(&Theme::instance(), &Theme::layoutDirectionChanged, this, &CPSlider::thumbCenterChanged);
 }

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/input/focusvisibility.h"
+#include "platform/input/onepointerdrag.h"
 #include "service/colorpickerstate.h"
 #include "sliders/colorcomponent.h"
 
@@ -51,7 +53,7 @@ public:
     /** In the item's coordinates. */
     QPointF thumbCenter() const;
     /** The keyboard is here and the user is using it. */
-    bool focusVisible() const { return m_focusVisible; }
+    bool focusVisible() const { return m_focusVisibility.isVisible(); }
 
 Q_SIGNALS:
     void colorPickerStateChanged();
@@ -63,37 +65,25 @@ Q_SIGNALS:
 protected:
     void geometryChange(const QRectF &newGeometry, const QRectF &oldGeometry) override;
 
-    void mousePressEvent(QMouseEvent *event) override;
-    void mouseMoveEvent(QMouseEvent *event) override;
-    void mouseReleaseEvent(QMouseEvent *event) override;
-    void mouseUngrabEvent() override;
-    void touchEvent(QTouchEvent *event) override;
-    void touchUngrabEvent() override;
+    void mousePressEvent(QMouseEvent *event) override { m_pointerDrag.mousePress(*event); }
+    void mouseMoveEvent(QMouseEvent *event) override { m_pointerDrag.mouseMove(*event); }
+    void mouseReleaseEvent(QMouseEvent *) override { m_pointerDrag.mouseUngrab(); }
+    void mouseUngrabEvent() override { m_pointerDrag.mouseUngrab(); }
+    void touchEvent(QTouchEvent *event) override { m_pointerDrag.touch(*event); }
+    void touchUngrabEvent() override { m_pointerDrag.touchUngrab(); }
     void keyPressEvent(QKeyEvent *event) override;
-    void focusInEvent(QFocusEvent *event) override;
-    void focusOutEvent(QFocusEvent *event) override;
+    void focusInEvent(QFocusEvent *event) override { m_focusVisibility.focusIn(*event); }
+    void focusOutEvent(QFocusEvent *event) override { m_focusVisibility.focusOut(*event); }
 
 private:
-    /** The one pointer that drags: the mouse, or a touch point by its id. */
-    struct Pointer
-    {
-        enum class Device { Mouse, Touch } device = Device::Mouse;
-        int id = 0;
-
-        bool operator==(const Pointer &) const = default;
-    };
-
     void announceValue();
-    void beginDrag(Pointer pointer, QPointF location);
     void drag(QPointF location);
     void endDrag();
-    void handleTouchPoint(const QEventPoint &point);
-    void setFocusVisible(bool visible);
 
     QPointer<service::ColorPickerState> m_state;
     ColorComponent::Name m_component = ColorComponent::Red;
-    std::optional<Pointer> m_pointer;
-    bool m_focusVisible = false;
+    platform::OnePointerDrag m_pointerDrag;
+    platform::FocusVisibility m_focusVisibility;
 };
 
 } // namespace favrin::sliders

@@ -3,8 +3,6 @@
 #include "platform/strings/localizedstring.h"
 #include "spectrum/spectrum.h"
 
-#include <QQuickWindow>
-
 #include <algorithm>
 #include <cmath>
 
@@ -17,16 +15,11 @@ constexpr double stepShare = 0.01;
 
 } // namespace
 
-AccessibleAxis::AccessibleAxis(Spectrum &spectrum, Axis axis) : m_spectrum(&spectrum), m_axis(axis) {}
+AccessibleAxis::AccessibleAxis(Spectrum &spectrum, Axis axis) : AccessiblePart(spectrum), m_axis(axis) {}
 
-QWindow *AccessibleAxis::window() const
+Spectrum *AccessibleAxis::spectrum() const
 {
-    return m_spectrum ? m_spectrum->window() : nullptr;
-}
-
-QAccessibleInterface *AccessibleAxis::parent() const
-{
-    return QAccessible::queryAccessibleInterface(m_spectrum);
+    return static_cast<Spectrum *>(item());
 }
 
 QString AccessibleAxis::text(QAccessible::Text kind) const
@@ -39,49 +32,34 @@ QString AccessibleAxis::text(QAccessible::Text kind) const
     return QString::fromStdString(name);
 }
 
-QRect AccessibleAxis::rect() const
-{
-    const QAccessibleInterface *spectrum = parent();
-    return spectrum ? spectrum->rect() : QRect();
-}
-
-QAccessible::State AccessibleAxis::state() const
-{
-    QAccessible::State state;
-    state.invalid = m_spectrum.isNull();
-    state.invisible = !m_spectrum || !m_spectrum->isVisible();
-    state.disabled = !m_spectrum || !m_spectrum->isEnabled();
-    return state;
-}
-
 void *AccessibleAxis::interface_cast(QAccessible::InterfaceType type)
 {
     if (type == QAccessible::ValueInterface)
         return static_cast<QAccessibleValueInterface *>(this);
-    return type == QAccessible::ActionInterface ? static_cast<QAccessibleActionInterface *>(this) : nullptr;
+    return AccessiblePart::interface_cast(type);
 }
 
 QVariant AccessibleAxis::currentValue() const
 {
-    if (!m_spectrum || m_spectrum->size().isEmpty())
+    if (!spectrum() || spectrum()->size().isEmpty())
         return 0.0;
-    const QPointF place = m_spectrum->pickPlace();
-    const double share = m_axis == Axis::Hue ? place.y() / m_spectrum->height() : 1.0 - place.x() / m_spectrum->width();
+    const QPointF place = spectrum()->pickPlace();
+    const double share = m_axis == Axis::Hue ? place.y() / spectrum()->height() : 1.0 - place.x() / spectrum()->width();
     return std::round(share * maximumValue().toDouble());
 }
 
 void AccessibleAxis::setCurrentValue(const QVariant &value)
 {
     const double number = value.toDouble();
-    if (!m_spectrum || !m_spectrum->isEnabled() || !std::isfinite(number))
+    if (!spectrum() || !spectrum()->isEnabled() || !std::isfinite(number))
         return;
     const double share = std::clamp(number / maximumValue().toDouble(), 0.0, 1.0);
-    QPointF place = m_spectrum->pickPlace();
+    QPointF place = spectrum()->pickPlace();
     if (m_axis == Axis::Hue)
-        place.setY(share * m_spectrum->height());
+        place.setY(share * spectrum()->height());
     else
-        place.setX((1.0 - share) * m_spectrum->width());
-    m_spectrum->pickFinally(place);
+        place.setX((1.0 - share) * spectrum()->width());
+    spectrum()->pickFinally(place);
 }
 
 QVariant AccessibleAxis::maximumValue() const

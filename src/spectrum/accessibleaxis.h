@@ -1,14 +1,13 @@
 #pragma once
 
-#include <QAccessibleInterface>
-#include <QPointer>
+#include "platform/accessibility/accessiblepart.h"
 
 namespace favrin::spectrum {
 
 class Spectrum;
 
 /** One axis of the field as assistive technologies see it: a slider, which picks finally. */
-class AccessibleAxis : public QAccessibleInterface, public QAccessibleValueInterface, public QAccessibleActionInterface
+class AccessibleAxis : public platform::AccessiblePart, public QAccessibleValueInterface
 {
 public:
     enum class Axis {
@@ -20,19 +19,8 @@ public:
 
     AccessibleAxis(Spectrum &spectrum, Axis axis);
 
-    bool isValid() const override { return !m_spectrum.isNull(); }
-    QObject *object() const override { return nullptr; }
-    QWindow *window() const override;
-    QAccessibleInterface *parent() const override;
-    QAccessibleInterface *child(int) const override { return nullptr; }
-    QAccessibleInterface *childAt(int, int) const override { return nullptr; }
-    int childCount() const override { return 0; }
-    int indexOfChild(const QAccessibleInterface *) const override { return -1; }
     QString text(QAccessible::Text kind) const override;
-    void setText(QAccessible::Text, const QString &) override {}
-    QRect rect() const override;
     QAccessible::Role role() const override { return QAccessible::Slider; }
-    QAccessible::State state() const override;
     void *interface_cast(QAccessible::InterfaceType type) override;
 
     QVariant currentValue() const override;
@@ -43,12 +31,12 @@ public:
 
     QStringList actionNames() const override;
     void doAction(const QString &actionName) override;
-    QStringList keyBindingsForAction(const QString &) const override { return {}; }
 
     Axis axis() const { return m_axis; }
 
 private:
-    QPointer<Spectrum> m_spectrum;
+    Spectrum *spectrum() const;
+
     Axis m_axis;
 };
 

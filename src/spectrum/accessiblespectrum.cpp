@@ -1,13 +1,12 @@
 #include "spectrum/accessiblespectrum.h"
 
 #include "model/axcolordescription.h"
+#include "platform/accessibility/accessibleitem.h"
 #include "platform/queue/queue.h"
 #include "platform/strings/localizedstring.h"
 #include "spectrum/accessibleaxis.h"
 #include "spectrum/spectrum.h"
 
-#include <QAccessibleObject>
-#include <QQuickWindow>
 #include <QScopedValueRollback>
 
 #include <array>
@@ -17,11 +16,11 @@ namespace {
 
 constexpr std::array axes = {AccessibleAxis::Axis::Hue, AccessibleAxis::Axis::Lightness};
 
-class AccessibleSpectrum : public QAccessibleObject
+class AccessibleSpectrum : public platform::AccessibleItem
 {
 public:
     explicit AccessibleSpectrum(Spectrum *spectrum)
-        : QAccessibleObject(spectrum), m_description(platform::backgroundQueue(), platform::mainQueue(), [this] {
+        : AccessibleItem(spectrum), m_description(platform::backgroundQueue(), platform::mainQueue(), [this] {
             notify(QAccessible::DescriptionChanged);
         })
     {
@@ -36,17 +35,6 @@ public:
             if (axis)
                 QAccessible::deleteAccessibleInterface(axis);
         }
-    }
-
-    QWindow *window() const override { return spectrum()->window(); }
-
-    QAccessibleInterface *parent() const override
-    {
-        for (QQuickItem *item = spectrum()->parentItem(); item; item = item->parentItem()) {
-            if (QAccessibleInterface *interface = QAccessible::queryAccessibleInterface(item))
-                return interface;
-        }
-        return QAccessible::queryAccessibleInterface(window());
     }
 
     int childCount() const override { return static_cast<int>(axes.size()); }
@@ -86,25 +74,7 @@ public:
         }
     }
 
-    QRect rect() const override
-    {
-        if (!window())
-            return {};
-        const QRectF inWindow = spectrum()->mapRectToScene(spectrum()->boundingRect());
-        return QRectF(window()->mapToGlobal(inWindow.topLeft()), inWindow.size()).toRect();
-    }
-
     QAccessible::Role role() const override { return QAccessible::ColorChooser; }
-
-    QAccessible::State state() const override
-    {
-        QAccessible::State state;
-        state.focusable = true;
-        state.focused = spectrum()->hasActiveFocus();
-        state.invisible = !spectrum()->isVisible();
-        state.disabled = !spectrum()->isEnabled();
-        return state;
-    }
 
     void announce(const QString &text)
     {
@@ -121,7 +91,7 @@ public:
 private:
     Spectrum *spectrum() const
     {
-        return static_cast<Spectrum *>(object());
+        return static_cast<Spectrum *>(item());
     }
 
     QString colorName() const

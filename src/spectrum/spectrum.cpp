@@ -10,15 +10,18 @@ using model::SomeColor;
 using service::ColorPickerState;
 
 Spectrum::Spectrum(QQuickItem *parent)
-    : QQuickItem(parent), m_spectrum(new SpectrumView(this)), m_lens(new lens::ColorLens(this))
+    : QQuickItem(parent)
+    , m_spectrum(new SpectrumView(this))
+    , m_lens(new lens::ColorLens(this))
+    , m_pointerDrag(
+          *this, [this](QPointF location) { pointerMoved(location); }, [this] { endDrag(); })
+    , m_focusVisibility([this] { Q_EMIT focusVisibleChanged(); })
 {
     installAccessibleSpectrum();
     m_lens->setSize({lensExtent, lensExtent});
     m_lens->setVisible(false);
     // Over whatever is placed in the spectrum, such as a focus ring.
     m_lens->setZ(1.0);
-    setAcceptedMouseButtons(Qt::LeftButton);
-    setAcceptTouchEvents(true);
     setActiveFocusOnTab(true);
 }
 

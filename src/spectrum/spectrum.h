@@ -1,6 +1,8 @@
 #pragma once
 
 #include "lens/colorlens.h"
+#include "platform/input/focusvisibility.h"
+#include "platform/input/onepointerdrag.h"
 #include "service/colorpickerstate.h"
 #include "spectrum/spectrumrules.h"
 
@@ -36,7 +38,7 @@ public:
     /** Of the field's corners, in points. */
     double cornerRadius() const;
     /** The keyboard is here and the user is using it. */
-    bool focusVisible() const { return m_focusVisible; }
+    bool focusVisible() const { return m_focusVisibility.isVisible(); }
 
     SpectrumView &spectrum() { return *m_spectrum; }
     const lens::ColorLens &lens() const { return *m_lens; }
@@ -54,44 +56,32 @@ Q_SIGNALS:
 
 protected:
     void geometryChange(const QRectF &newGeometry, const QRectF &oldGeometry) override;
-    void mousePressEvent(QMouseEvent *event) override;
-    void mouseMoveEvent(QMouseEvent *event) override;
-    void mouseReleaseEvent(QMouseEvent *event) override;
-    void mouseUngrabEvent() override;
-    void touchEvent(QTouchEvent *event) override;
-    void touchUngrabEvent() override;
+    void mousePressEvent(QMouseEvent *event) override { m_pointerDrag.mousePress(*event); }
+    void mouseMoveEvent(QMouseEvent *event) override { m_pointerDrag.mouseMove(*event); }
+    void mouseReleaseEvent(QMouseEvent *) override { m_pointerDrag.mouseUngrab(); }
+    void mouseUngrabEvent() override { m_pointerDrag.mouseUngrab(); }
+    void touchEvent(QTouchEvent *event) override { m_pointerDrag.touch(*event); }
+    void touchUngrabEvent() override { m_pointerDrag.touchUngrab(); }
     void keyPressEvent(QKeyEvent *event) override;
     void keyReleaseEvent(QKeyEvent *event) override;
-    void focusInEvent(QFocusEvent *event) override;
+    void focusInEvent(QFocusEvent *event) override { m_focusVisibility.focusIn(*event); }
     void focusOutEvent(QFocusEvent *event) override;
 
 private:
-    /** The one pointer that drags: the mouse, or a touch point by its id. */
-    struct Pointer
-    {
-        enum class Device { Mouse, Touch } device = Device::Mouse;
-        int id = 0;
-
-        bool operator==(const Pointer &) const = default;
-    };
-
     void colorChanged();
     void placeLens();
     void pick(QPointF location);
     void drag(QPointF location);
     void endDrag();
-    void beginPointerDrag(Pointer pointer, QPointF location);
-    void endPointerDrag();
-    void handleTouchPoint(const QEventPoint &point);
-    void setFocusVisible(bool visible);
+    void pointerMoved(QPointF location);
 
     QPointer<service::ColorPickerState> m_state;
     SpectrumView *m_spectrum;
     lens::ColorLens *m_lens;
     SpectrumDrag m_drag;
-    std::optional<Pointer> m_pointer;
+    platform::OnePointerDrag m_pointerDrag;
+    platform::FocusVisibility m_focusVisibility;
     QSet<int> m_heldKeys;
-    bool m_focusVisible = false;
 };
 
 } // namespace favrin::spectrum
