@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/favrinhostexport.h"
+#include "favrinhostexport.h"
 
 #include <QColor>
 #include <QColorSpace>

@@ -2,48 +2,45 @@
 
 #include "host/colorbridge.h"
 #include "host/fvcolorpickerviewcontroller_p.h"
-#include "host/remoteviewitem.h"
-#include "host/serviceahead.h"
-#include "host/serviceprocess.h"
 
 #include <QQuickWindow>
 
 #include <utility>
 
+using favrin::host::Picker;
 using favrin::host::PresentationStyle;
-using favrin::host::RemotePicker;
 
 FVColorPickerViewController::Private::Private(FVColorPickerViewController &controller)
 {
     auto *self = &controller;
-    QObject::connect(&picker, &RemotePicker::picked, self,
+    QObject::connect(picker.get(), &Picker::picked, self,
                      [this, self](const auto &color, const auto &colorspace, bool isVolatile) {
                          selectedColor = favrin::host::toPublicColor(color);
                          Q_EMIT self->selectedColorChanged();
                          Q_EMIT self->pickerDidSelectColor(
                              selectedColor, colorspace ? QString::fromStdString(*colorspace) : QString(), isVolatile);
                      });
-    QObject::connect(&picker, &RemotePicker::eyedropperShown, self,
+    QObject::connect(picker.get(), &Picker::eyedropperShown, self,
                      &FVColorPickerViewController::pickerDidShowEyedropper);
-    QObject::connect(&picker, &RemotePicker::eyedropperFloated, self,
+    QObject::connect(picker.get(), &Picker::eyedropperFloated, self,
                      &FVColorPickerViewController::pickerDidFloatEyedropper);
-    QObject::connect(&picker, &RemotePicker::eyedropperDismissed, self,
+    QObject::connect(picker.get(), &Picker::eyedropperDismissed, self,
                      &FVColorPickerViewController::pickerDidDismissEyedropper);
-    QObject::connect(&picker, &RemotePicker::finished, self, &FVColorPickerViewController::colorPickerDidFinish);
-    QObject::connect(&picker, &RemotePicker::terminated, self,
+    QObject::connect(picker.get(), &Picker::finished, self, &FVColorPickerViewController::colorPickerDidFinish);
+    QObject::connect(picker.get(), &Picker::terminated, self,
                      &FVColorPickerViewController::colorPickerViewServiceDidTerminateWithError);
-    QObject::connect(&picker, &RemotePicker::stateChanged, self, &FVColorPickerViewController::stateChanged);
-    QObject::connect(&picker, &RemotePicker::preferredContentSizeChanged, self, [this, self](QSizeF size) {
+    QObject::connect(picker.get(), &Picker::stateChanged, self, &FVColorPickerViewController::stateChanged);
+    QObject::connect(picker.get(), &Picker::preferredContentSizeChanged, self, [this, self](QSizeF size) {
         if (std::exchange(preferredContentSize, size) == size)
             return;
         Q_EMIT self->preferredContentSizeChanged();
     });
-    QObject::connect(&picker, &RemotePicker::materialChanged, self, [this, self](bool wanted) {
+    QObject::connect(picker.get(), &Picker::materialChanged, self, [this, self](bool wanted) {
         if (std::exchange(wantsMaterial, wanted) == wanted)
             return;
         Q_EMIT self->wantsMaterialChanged();
     });
-    QObject::connect(&picker, &RemotePicker::surroundingsChanged, self, [self] {
+    QObject::connect(picker.get(), &Picker::surroundingsChanged, self, [self] {
         Q_EMIT self->hostWindowSizeChanged();
         Q_EMIT self->keyboardSpaceChanged();
     });
@@ -66,7 +63,7 @@ void FVColorPickerViewController::setSelectedColor(const FVColor &color)
     const bool changed = color != d->selectedColor;
     d->selectedColor = color;
     // An equal color is sent too: the picker may be in the middle of a pick that this one ends.
-    d->picker.setSelectedColor(favrin::host::toPlatformColor(color));
+    d->picker->setSelectedColor(favrin::host::toPlatformColor(color));
     if (changed)
         Q_EMIT selectedColorChanged();
 }
@@ -83,43 +80,33 @@ bool FVColorPickerViewController::wantsMaterial() const
 
 FVColorPickerViewController::State FVColorPickerViewController::state() const
 {
-    return static_cast<State>(d->picker.state());
+    return static_cast<State>(d->picker->state());
 }
 
 void FVColorPickerViewController::present(QQuickWindow *window)
 {
     if (window)
-        d->picker.present(PresentationStyle::Presented, *window->contentItem());
+        d->picker->present(PresentationStyle::Presented, *window->contentItem());
 }
 
 void FVColorPickerViewController::presentPopover(QQuickItem *anchor)
 {
     if (anchor && anchor->window())
-        d->picker.present(PresentationStyle::Popover, *anchor);
+        d->picker->present(PresentationStyle::Popover, *anchor);
 }
 
 void FVColorPickerViewController::embed(QQuickItem *container)
 {
     if (container && container->window())
-        d->picker.present(PresentationStyle::Embedded, *container);
+        d->picker->present(PresentationStyle::Embedded, *container);
 }
 
 void FVColorPickerViewController::dismiss()
 {
-    d->picker.dismiss();
+    d->picker->dismiss();
 }
 
 QQuickItem *FVColorPickerViewController::view() const
 {
-    return d->picker.view();
-}
-
-void FVColorPickerViewController::startServiceAhead()
-{
-    favrin::host::ServiceAhead::instance().start(RemotePicker().traits());
-}
-
-QString FVColorPickerViewController::servicePath()
-{
-    return favrin::host::ServiceProcess::program();
+    return d->picker->view();
 }

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "host/favrinhostexport.h"
-#include "host/fvcolor.h"
+#include "favrinhostexport.h"
+#include "fvcolor.h"
 
 #include <QList>
 #include <QLocale>
@@ -232,6 +232,6 @@ Q_SIGNALS:
     void stateChanged();
 
 private:
-    class Private;
+    class Q_DECL_HIDDEN Private;
     std::unique_ptr<Private> d;
 };

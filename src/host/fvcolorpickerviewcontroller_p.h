@@ -1,14 +1,14 @@
 #pragma once
 
 #include "host/fvcolorpickerviewcontroller.h"
-#include "host/remotepicker.h"
+#include "host/picker.h"
 
 class FVColorPickerViewController::Private
 {
 public:
     explicit Private(FVColorPickerViewController &controller);
 
-    favrin::host::RemotePicker picker;
+    const std::unique_ptr<favrin::host::Picker> picker = favrin::host::Picker::create();
     FVColor selectedColor;
     QList<FVColor> suggestedColors;
     QSizeF preferredContentSize = QSizeF(0, 0);
@@ -18,9 +18,9 @@ public:
     template<class Field, class Value>
     bool store(Field field, const Value &value)
     {
-        if (field(picker.wishes()) == value)
+        if (field(picker->wishes()) == value)
             return false;
-        picker.change([&](favrin::host::PickerWishes &wishes) { field(wishes) = value; });
+        picker->change([&](favrin::host::PickerWishes &wishes) { field(wishes) = value; });
         return true;
     }
 };

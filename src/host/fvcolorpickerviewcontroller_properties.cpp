@@ -11,7 +11,7 @@ namespace remote = favrin::remote;
 
 QString FVColorPickerViewController::title() const
 {
-    const auto &title = d->picker.wishes().configuration.title;
+    const auto &title = d->picker->wishes().configuration.title;
     return title ? QString::fromStdString(*title) : QString();
 }
 
@@ -30,7 +30,7 @@ void FVColorPickerViewController::resetTitle()
 
 bool FVColorPickerViewController::showsAlpha() const
 {
-    return d->picker.wishes().configuration.showsAlpha;
+    return d->picker->wishes().configuration.showsAlpha;
 }
 
 void FVColorPickerViewController::setShowsAlpha(bool value)
@@ -42,7 +42,7 @@ void FVColorPickerViewController::setShowsAlpha(bool value)
 
 bool FVColorPickerViewController::allowsNoColor() const
 {
-    return d->picker.wishes().configuration.allowsNoColor;
+    return d->picker->wishes().configuration.allowsNoColor;
 }
 
 void FVColorPickerViewController::setAllowsNoColor(bool value)
@@ -54,7 +54,7 @@ void FVColorPickerViewController::setAllowsNoColor(bool value)
 
 bool FVColorPickerViewController::showsEyedropper() const
 {
-    return d->picker.wishes().configuration.showsEyedropper;
+    return d->picker->wishes().configuration.showsEyedropper;
 }
 
 void FVColorPickerViewController::setShowsEyedropper(bool value)
@@ -66,7 +66,7 @@ void FVColorPickerViewController::setShowsEyedropper(bool value)
 
 bool FVColorPickerViewController::usesDarkGridInDarkMode() const
 {
-    return d->picker.wishes().configuration.shouldUseDarkGridInDarkMode;
+    return d->picker->wishes().configuration.shouldUseDarkGridInDarkMode;
 }
 
 void FVColorPickerViewController::setUsesDarkGridInDarkMode(bool value)
@@ -78,7 +78,7 @@ void FVColorPickerViewController::setUsesDarkGridInDarkMode(bool value)
 
 bool FVColorPickerViewController::reduceMotion() const
 {
-    return d->picker.wishes().reduceMotion;
+    return d->picker->wishes().reduceMotion;
 }
 
 void FVColorPickerViewController::setReduceMotion(bool value)
@@ -90,7 +90,7 @@ void FVColorPickerViewController::setReduceMotion(bool value)
 
 bool FVColorPickerViewController::increaseContrast() const
 {
-    return d->picker.wishes().increaseContrast;
+    return d->picker->wishes().increaseContrast;
 }
 
 void FVColorPickerViewController::setIncreaseContrast(bool value)
@@ -129,7 +129,7 @@ void FVColorPickerViewController::resetSuggestedColors()
 
 FVColorPickerViewController::Appearance FVColorPickerViewController::gridAppearance() const
 {
-    return static_cast<Appearance>(d->picker.wishes().configuration.userInterfaceStyleForGrid);
+    return static_cast<Appearance>(d->picker->wishes().configuration.userInterfaceStyleForGrid);
 }
 
 void FVColorPickerViewController::setGridAppearance(Appearance appearance)
@@ -142,7 +142,7 @@ void FVColorPickerViewController::setGridAppearance(Appearance appearance)
 
 FVColorPickerViewController::Appearance FVColorPickerViewController::appearance() const
 {
-    return static_cast<Appearance>(d->picker.wishes().appearance);
+    return static_cast<Appearance>(d->picker->wishes().appearance);
 }
 
 void FVColorPickerViewController::setAppearance(Appearance value)
@@ -154,7 +154,7 @@ void FVColorPickerViewController::setAppearance(Appearance value)
 
 FVColorPickerViewController::TextSizeCategory FVColorPickerViewController::textSizeCategory() const
 {
-    return static_cast<TextSizeCategory>(d->picker.wishes().textSizeCategory);
+    return static_cast<TextSizeCategory>(d->picker->wishes().textSizeCategory);
 }
 
 void FVColorPickerViewController::setTextSizeCategory(TextSizeCategory value)
@@ -167,7 +167,7 @@ void FVColorPickerViewController::setTextSizeCategory(TextSizeCategory value)
 
 FVColorPickerViewController::DisplayGamut FVColorPickerViewController::displayGamut() const
 {
-    return static_cast<DisplayGamut>(d->picker.wishes().displayGamut);
+    return static_cast<DisplayGamut>(d->picker->wishes().displayGamut);
 }
 
 void FVColorPickerViewController::setDisplayGamut(DisplayGamut value)
@@ -179,7 +179,7 @@ void FVColorPickerViewController::setDisplayGamut(DisplayGamut value)
 
 Qt::LayoutDirection FVColorPickerViewController::layoutDirection() const
 {
-    return d->picker.wishes().layoutDirection.value_or(QGuiApplication::layoutDirection());
+    return d->picker->wishes().layoutDirection.value_or(QGuiApplication::layoutDirection());
 }
 
 void FVColorPickerViewController::setLayoutDirection(Qt::LayoutDirection value)
@@ -198,7 +198,7 @@ void FVColorPickerViewController::resetLayoutDirection()
 
 QLocale FVColorPickerViewController::locale() const
 {
-    return d->picker.wishes().locale.value_or(QLocale());
+    return d->picker->wishes().locale.value_or(QLocale());
 }
 
 void FVColorPickerViewController::setLocale(const QLocale &value)
@@ -217,7 +217,7 @@ void FVColorPickerViewController::resetLocale()
 
 QSizeF FVColorPickerViewController::hostWindowSize() const
 {
-    return d->picker.hostWindowSize();
+    return d->picker->hostWindowSize();
 }
 
 void FVColorPickerViewController::setHostWindowSize(QSizeF value)
@@ -236,7 +236,7 @@ void FVColorPickerViewController::resetHostWindowSize()
 
 double FVColorPickerViewController::keyboardSpace() const
 {
-    return d->picker.keyboardSpace();
+    return d->picker->keyboardSpace();
 }
 
 void FVColorPickerViewController::setKeyboardSpace(double value)

@@ -47,7 +47,12 @@ std::string displayIdentifier(const QQuickWindow *window)
 
 } // namespace
 
-RemotePicker::RemotePicker(QObject *parent) : QObject(parent)
+std::unique_ptr<Picker> Picker::create()
+{
+    return std::make_unique<RemotePicker>();
+}
+
+RemotePicker::RemotePicker(QObject *parent) : Picker(parent)
 {
     m_farewell.setSingleShot(true);
     m_farewell.setInterval(farewellPatience);
@@ -66,13 +71,7 @@ bool RemotePicker::eventFilter(QObject *watched, QEvent *event)
 {
     if (event->type() == QEvent::ApplicationPaletteChange)
         scheduleUpdate();
-    return QObject::eventFilter(watched, event);
-}
-
-void RemotePicker::setState(State state)
-{
-    if (std::exchange(m_state, state) != state)
-        Q_EMIT stateChanged();
+    return Picker::eventFilter(watched, event);
 }
 
 bool RemotePicker::isDark() const
@@ -86,35 +85,35 @@ remote::Traits RemotePicker::traits() const
     remote::Traits traits;
     traits.presentationContext =
         m_presentation ? contextOf(m_presentation->style()) : remote::PresentationContext::Unspecified;
-    traits.appearance = m_wishes.appearance;
+    traits.appearance = wishes().appearance;
     if (traits.appearance == remote::Appearance::Unspecified) {
         const bool dark = QGuiApplication::palette().color(QPalette::Window).lightnessF() < 0.5f;
         traits.appearance = dark ? remote::Appearance::Dark : remote::Appearance::Light;
     }
-    const auto direction = m_wishes.layoutDirection.value_or(QGuiApplication::layoutDirection());
+    const auto direction = wishes().layoutDirection.value_or(QGuiApplication::layoutDirection());
     traits.layoutDirection =
         direction == Qt::RightToLeft ? remote::LayoutDirection::RightToLeft : remote::LayoutDirection::LeftToRight;
-    traits.textSizeCategory = m_wishes.textSizeCategory;
-    traits.displayGamut = m_wishes.displayGamut;
+    traits.textSizeCategory = wishes().textSizeCategory;
+    traits.displayGamut = wishes().displayGamut;
     traits.displayIdentifier = displayIdentifier(window);
-    traits.locale = m_wishes.locale.value_or(QLocale()).bcp47Name().toStdString();
-    traits.reduceMotion = m_wishes.reduceMotion;
-    traits.increaseContrast = m_wishes.increaseContrast;
+    traits.locale = wishes().locale.value_or(QLocale()).bcp47Name().toStdString();
+    traits.reduceMotion = wishes().reduceMotion;
+    traits.increaseContrast = wishes().increaseContrast;
     return traits;
 }
 
 QSizeF RemotePicker::hostWindowSize() const
 {
-    if (m_wishes.hostWindowSize)
-        return *m_wishes.hostWindowSize;
+    if (wishes().hostWindowSize)
+        return *wishes().hostWindowSize;
     const QQuickWindow *window = m_presentation ? m_presentation->window() : nullptr;
     return window ? QSizeF(window->size()) : QSizeF(0, 0);
 }
 
 double RemotePicker::keyboardSpace() const
 {
-    if (m_wishes.keyboardSpace)
-        return *m_wishes.keyboardSpace;
+    if (wishes().keyboardSpace)
+        return *wishes().keyboardSpace;
     const auto *item = view();
     const auto *inputMethod = QGuiApplication::inputMethod();
     if (!item || !inputMethod->isVisible())
@@ -126,7 +125,7 @@ double RemotePicker::keyboardSpace() const
     return std::max(0.0, place.bottom() - keyboard.top());
 }
 
-RemoteViewItem *RemotePicker::view() const
+QQuickItem *RemotePicker::view() const
 {
     return m_presentation ? m_presentation->view() : nullptr;
 }
@@ -142,7 +141,7 @@ void RemotePicker::present(PresentationStyle style, QQuickItem &place)
         return;
     tearDown();
     m_presentation = std::make_unique<Presentation>(style, place);
-    m_wishes.configuration.isEmbedded = style == PresentationStyle::Embedded;
+    setEmbedded(style == PresentationStyle::Embedded);
     QString error;
     m_session = ServiceAhead::instance().take(traits(), &error);
     setState(State::Starting);
@@ -231,7 +230,7 @@ void RemotePicker::sendUpdate()
         m_sentTraits = std::move(now);
         m_presentation->setAppearance(isDark());
     }
-    auto configuration = m_wishes.configuration;
+    auto configuration = wishes().configuration;
     configuration.hostWindowWidth = hostWindowSize().width();
     configuration.hostWindowHeight = hostWindowSize().height();
     configuration.keyboardSpace = keyboardSpace();
@@ -257,7 +256,7 @@ void RemotePicker::setSelectedColor(const std::optional<platform::Color> &color)
 
 void RemotePicker::servicePrepared(quint32 serial)
 {
-    if (serial != m_serial || m_state != State::Starting)
+    if (serial != m_serial || state() != State::Starting)
         return;
     // The preferred size came before the answer, so the first frame has the right size already.
     m_presentation->view()->setSession(m_session.get());
@@ -268,9 +267,9 @@ void RemotePicker::servicePrepared(quint32 serial)
 
 void RemotePicker::serviceDrew()
 {
-    if (m_state != State::Starting)
+    if (state() != State::Starting)
         return;
-    m_presentation->reveal(!m_wishes.reduceMotion);
+    m_presentation->reveal(!wishes().reduceMotion);
     setState(State::Ready);
 }
 
@@ -288,7 +287,7 @@ void RemotePicker::dismiss()
 
 void RemotePicker::serviceFinished()
 {
-    if (!isPresented() && m_state != State::Stopping)
+    if (!isPresented() && state() != State::Stopping)
         return;
     tearDown();
     setState(State::NotRunning);
@@ -297,7 +296,7 @@ void RemotePicker::serviceFinished()
 
 void RemotePicker::serviceEnded(const QString &error)
 {
-    if (m_state == State::Stopping) {
+    if (state() == State::Stopping) {
         serviceFinished();
         return;
     }

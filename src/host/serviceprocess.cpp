@@ -89,7 +89,8 @@ QString folderOfThisLibrary()
     Dl_info info;
     if (!dladdr(reinterpret_cast<const void *>(&folderOfThisLibrary), &info) || !info.dli_fname)
         return {};
-    return QFileInfo(QFile::decodeName(info.dli_fname)).absolutePath();
+    // Without links: the way from here to the service leads over the folder that really holds the library.
+    return QFileInfo(QFileInfo(QFile::decodeName(info.dli_fname)).absolutePath()).canonicalFilePath();
 }
 
 QString describe(const siginfo_t &info)

@@ -1,0 +1,91 @@
+#pragma once
+
+#include "host/presentationlayout.h"
+#include "remote/records.h"
+
+#include <QLocale>
+#include <QObject>
+#include <QSizeF>
+
+#include <memory>
+#include <optional>
+#include <string>
+
+class QQuickItem;
+
+namespace favrin::host {
+
+/** What the app asked for; what it left open is taken from the window and the application. */
+struct PickerWishes
+{
+    remote::Configuration configuration;
+    remote::Appearance appearance = remote::Appearance::Unspecified;
+    remote::TextSizeCategory textSizeCategory = remote::TextSizeCategory::Large;
+    remote::DisplayGamut displayGamut = remote::DisplayGamut::SRGB;
+    bool reduceMotion = false;
+    bool increaseContrast = false;
+    std::optional<Qt::LayoutDirection> layoutDirection;
+    std::optional<QLocale> locale;
+    std::optional<QSizeF> hostWindowSize;
+    std::optional<double> keyboardSpace;
+};
+
+/**
+ * What stands behind the public class, which is a thin face of this one: what the app wishes, an explicit state, and
+ * what the picker says. GUI thread.
+ */
+class Picker : public QObject
+{
+    Q_OBJECT
+
+public:
+    enum class State { NotRunning, Starting, Ready, Stopping, Failed };
+
+    /** The picker of the library that is linked: a remote one, or one that plays a script for an app's tests. */
+    static std::unique_ptr<Picker> create();
+
+    State state() const { return m_state; }
+    bool isPresented() const { return m_state == State::Starting || m_state == State::Ready; }
+    const PickerWishes &wishes() const { return m_wishes; }
+    /** Changes what the app asks for; the picker hears of it before this turn of the event loop ends. */
+    template<class Change>
+    void change(Change change)
+    {
+        change(m_wishes);
+        wishesDidChange();
+    }
+    /** The color that the picker shows, without an echo; none for no color. */
+    virtual void setSelectedColor(const std::optional<platform::Color> &color) = 0;
+    virtual QSizeF hostWindowSize() const = 0;
+    virtual double keyboardSpace() const = 0;
+
+    virtual void present(PresentationStyle style, QQuickItem &place) = 0;
+    virtual void dismiss() = 0;
+    virtual QQuickItem *view() const = 0;
+
+Q_SIGNALS:
+    void stateChanged();
+    void picked(const std::optional<favrin::platform::Color> &color, const std::optional<std::string> &colorspace,
+                bool isVolatile);
+    void eyedropperShown();
+    void eyedropperFloated();
+    void eyedropperDismissed();
+    void finished();
+    void terminated(const QString &error);
+    void preferredContentSizeChanged(QSizeF size);
+    void materialChanged(bool wanted);
+    void surroundingsChanged();
+
+protected:
+    using QObject::QObject;
+
+    void setState(State state);
+    void setEmbedded(bool embedded) { m_wishes.configuration.isEmbedded = embedded; }
+    virtual void wishesDidChange() = 0;
+
+private:
+    State m_state = State::NotRunning;
+    PickerWishes m_wishes;
+};
+
+} // namespace favrin::host
