@@ -1,41 +1,23 @@
 #include "gridwindow.h"
 
-#include "platform/observation/publisher.h"
+#include "../shared/statewrites.h"
 #include "theme/theme.h"
-
-#include <QQmlComponent>
-#include <QQmlEngine>
 
 using namespace favrin;
 using model::SomeColor;
 
 namespace {
 
-/** Everything written into the state from now on, in order. */
-class Writes
+/** A color is the position of its swatch. */
+struct Writes : StateWrites
 {
-public:
     explicit Writes(service::ColorPickerState &state)
-        : m_flag(state.isVolatile.publisher().sink(
-              [this](bool flag) { m_log << (flag ? QStringLiteral("volatile") : QStringLiteral("final")); }))
-        , m_color(state.selectedColor.publisher().sink([this](const std::optional<SomeColor> &color) { add(color); }))
+        : StateWrites(state, [](const OptionalColor &color) {
+            const auto cell = grid::markedCell(color, grid::defaultColorMatrix());
+            return cell ? QStringLiteral("%1,%2").arg(cell->row).arg(cell->column) : QStringLiteral("other");
+        })
     {
-        m_log.clear();
     }
-
-    /** What was written since the last call. A color is the position of its swatch. */
-    QString take() { return std::exchange(m_log, {}).join(u' '); }
-
-private:
-    void add(const std::optional<SomeColor> &color)
-    {
-        const auto cell = grid::markedCell(color, grid::defaultColorMatrix());
-        m_log << (cell ? QStringLiteral("%1,%2").arg(cell->row).arg(cell->column) : QStringLiteral("other"));
-    }
-
-    QStringList m_log;
-    platform::Subscription m_flag;
-    platform::Subscription m_color;
 };
 
 } // namespace
@@ -48,15 +30,10 @@ private Q_SLOTS:
     void initTestCase();
     void init();
     void touchWritesFlagThenColor();
-    void cancelledTouchEndsTheGesture();
-    void secondFingerDoesNotDisturb();
     void mouseDragsBeyondTheEdges();
-    void otherMouseButtonsDoNothing();
     void keysPickFinally();
     void firstKeyStartsNearTheColor();
     void pickKeepsSpaceAndOpacity();
-    void dragIsKeptInsideAFlickable_data();
-    void dragIsKeptInsideAFlickable();
     void hidingEndsTheGesture();
     void neverMirrored();
     void darkPaletteIsPicked();
@@ -93,39 +70,6 @@ void ColorSwatchPickerViewTest::touchWritesFlagThenColor()
     QCOMPARE(grid.state.selectedColor(), std::optional(swatch(9, 0)));
 }
 
-void ColorSwatchPickerViewTest::cancelledTouchEndsTheGesture()
-{
-    GridWindow grid;
-    QVERIFY(grid.isReady());
-    Writes writes(grid.state);
-    QTest::touchEvent(&grid.window, m_touch.get()).press(0, GridWindow::middle(2, 3));
-    writes.take();
-    QTouchEvent cancel(QEvent::TouchCancel, m_touch.get());
-    QCoreApplication::sendEvent(&grid.window, &cancel);
-    QCOMPARE(writes.take(), QStringLiteral("final"));
-    QTest::touchEvent(&grid.window, m_touch.get()).press(1, GridWindow::middle(4, 4));
-    QCOMPARE(writes.take(), QStringLiteral("volatile 4,4"));
-    QTest::touchEvent(&grid.window, m_touch.get()).release(1, GridWindow::middle(4, 4));
-}
-
-void ColorSwatchPickerViewTest::secondFingerDoesNotDisturb()
-{
-    GridWindow grid;
-    QVERIFY(grid.isReady());
-    Writes writes(grid.state);
-    QTest::touchEvent(&grid.window, m_touch.get()).press(0, GridWindow::middle(2, 3));
-    writes.take();
-    QTest::touchEvent(&grid.window, m_touch.get()).stationary(0).press(1, GridWindow::middle(7, 7));
-    QTest::touchEvent(&grid.window, m_touch.get()).stationary(0).move(1, GridWindow::middle(8, 8));
-    QCOMPARE(writes.take(), QString());
-    QTest::touchEvent(&grid.window, m_touch.get()).move(0, GridWindow::middle(2, 5)).stationary(1);
-    QCOMPARE(writes.take(), QStringLiteral("volatile 2,5"));
-    QTest::touchEvent(&grid.window, m_touch.get()).stationary(0).release(1, GridWindow::middle(8, 8));
-    QCOMPARE(writes.take(), QString());
-    QTest::touchEvent(&grid.window, m_touch.get()).release(0, GridWindow::middle(2, 5));
-    QCOMPARE(writes.take(), QStringLiteral("final"));
-}
-
 void ColorSwatchPickerViewTest::mouseDragsBeyondTheEdges()
 {
     GridWindow grid;
@@ -135,15 +79,6 @@ void ColorSwatchPickerViewTest::mouseDragsBeyondTheEdges()
     QTest::mouseMove(&grid.window, QPoint(399, 100));
     QTest::mouseRelease(&grid.window, Qt::LeftButton, {}, QPoint(399, 100));
     QCOMPARE(writes.take(), QStringLiteral("volatile 0,0 volatile 2,11 final"));
-}
-
-void ColorSwatchPickerViewTest::otherMouseButtonsDoNothing()
-{
-    GridWindow grid;
-    QVERIFY(grid.isReady());
-    Writes writes(grid.state);
-    QTest::mouseClick(&grid.window, Qt::RightButton, {}, GridWindow::middle(3, 3));
-    QCOMPARE(writes.take(), QString());
 }
 
 void ColorSwatchPickerViewTest::keysPickFinally()
@@ -184,43 +119,6 @@ void ColorSwatchPickerViewTest::pickKeepsSpaceAndOpacity()
     QCOMPARE(grid.state.selectedColor(), std::optional(expected));
     QCOMPARE(grid.view->markedCell(), std::optional(grid::CellPosition{5, 2}));
     QVERIFY(!grid.view->isSelected({5, 2}));
-}
-
-void ColorSwatchPickerViewTest::dragIsKeptInsideAFlickable_data()
-{
-    QTest::addColumn<bool>("byTouch");
-    QTest::newRow("finger") << true;
-    QTest::newRow("mouse") << false;
-}
-
-void ColorSwatchPickerViewTest::dragIsKeptInsideAFlickable()
-{
-    QFETCH(bool, byTouch);
-    GridWindow grid;
-    QQmlEngine engine;
-    QQmlComponent component(&engine);
-    component.setData("import QtQuick; Flickable { width: 400; height: 340; contentHeight: 900 }", {});
-    std::unique_ptr<QQuickItem> flickable(qobject_cast<QQuickItem *>(component.create()));
-    QVERIFY2(flickable, qPrintable(component.errorString()));
-    flickable->setParentItem(grid.window.contentItem());
-    grid.view->setParentItem(flickable->property("contentItem").value<QQuickItem *>());
-    QVERIFY(grid.isReady());
-    Writes writes(grid.state);
-
-    if (byTouch) {
-        QTest::touchEvent(&grid.window, m_touch.get()).press(0, GridWindow::middle(8, 3));
-        for (int row = 7; row > 2; --row)
-            QTest::touchEvent(&grid.window, m_touch.get()).move(0, GridWindow::middle(row, 3));
-        QTest::touchEvent(&grid.window, m_touch.get()).release(0, GridWindow::middle(3, 3));
-    } else {
-        QTest::mousePress(&grid.window, Qt::LeftButton, {}, GridWindow::middle(8, 3));
-        for (int row = 7; row > 2; --row)
-            QTest::mouseMove(&grid.window, GridWindow::middle(row, 3));
-        QTest::mouseRelease(&grid.window, Qt::LeftButton, {}, GridWindow::middle(3, 3));
-    }
-    QCOMPARE(writes.take(), QStringLiteral("volatile 8,3 volatile 7,3 volatile 6,3 volatile 5,3 volatile 4,3 "
-                                           "volatile 3,3 final"));
-    QCOMPARE(flickable->property("contentY").toDouble(), 0.0);
 }
 
 void ColorSwatchPickerViewTest::hidingEndsTheGesture()

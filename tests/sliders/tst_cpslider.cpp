@@ -1,6 +1,6 @@
 #include "sliderswindow.h"
 
-#include "platform/observation/publisher.h"
+#include "../shared/statewrites.h"
 
 #include <QAccessible>
 #include <QPointingDevice>
@@ -16,25 +16,13 @@ using Space = SomeColor::ColorSpace;
 
 namespace {
 
-/** Everything written into the state from now on, in order: the red component, and the flag. */
-class Writes
+/** A color is its red component. */
+struct Writes : StateWrites
 {
-public:
     explicit Writes(service::ColorPickerState &state)
-        : m_flag(state.isVolatile.publisher().sink(
-              [this](bool flag) { m_log << (flag ? QStringLiteral("volatile") : QStringLiteral("final")); }))
-        , m_color(state.selectedColor.publisher().sink(
-              [this](const std::optional<SomeColor> &color) { m_log << QString::number(color ? color->r : -1.0); }))
+        : StateWrites(state, [](const OptionalColor &color) { return QString::number(color ? color->r : -1.0); })
     {
-        m_log.clear();
     }
-
-    QString take() { return std::exchange(m_log, {}).join(u' '); }
-
-private:
-    QStringList m_log;
-    platform::Subscription m_flag;
-    platform::Subscription m_color;
 };
 
 } // namespace
@@ -46,7 +34,6 @@ class CPSliderTest : public QObject
 private Q_SLOTS:
     void initTestCase();
     void cleanup();
-    void dragWritesValueThenFlag_data();
     void dragWritesValueThenFlag();
     void cancelledTouchEndsTheDrag();
     void mirroredDragStaysUnderTheFinger();
@@ -74,48 +61,23 @@ void CPSliderTest::cleanup()
     theme::Theme::instance().setLayoutDirection(Qt::LeftToRight);
 }
 
-void CPSliderTest::dragWritesValueThenFlag_data()
-{
-    QTest::addColumn<bool>("byTouch");
-    QTest::newRow("finger") << true;
-    QTest::newRow("mouse") << false;
-}
-
 void CPSliderTest::dragWritesValueThenFlag()
 {
-    QFETCH(bool, byTouch);
     SlidersWindow window;
     QVERIFY(window.isReady());
     const auto *red = window.slider(ColorComponent::Red);
     QCOMPARE(red->size(), QSizeF(236.0, 36.0));
-    const auto press = [&](double x) {
-        if (byTouch)
-            QTest::touchEvent(&window.window, m_touch.get()).press(0, SlidersWindow::at(red, x));
-        else
-            QTest::mousePress(&window.window, Qt::LeftButton, {}, SlidersWindow::at(red, x));
-    };
-    const auto move = [&](double x) {
-        if (byTouch)
-            QTest::touchEvent(&window.window, m_touch.get()).move(0, SlidersWindow::at(red, x));
-        else
-            QTest::mouseMove(&window.window, SlidersWindow::at(red, x));
-    };
-    const auto release = [&](double x) {
-        if (byTouch)
-            QTest::touchEvent(&window.window, m_touch.get()).release(0, SlidersWindow::at(red, x));
-        else
-            QTest::mouseRelease(&window.window, Qt::LeftButton, {}, SlidersWindow::at(red, x));
-    };
+    const auto at = [red](double x) { return SlidersWindow::at(red, x); };
     Writes writes(window.state);
-    press(118.0);
+    QTest::mousePress(&window.window, Qt::LeftButton, {}, at(118.0));
     QCOMPARE(writes.take(), QStringLiteral("0.5 volatile"));
-    move(168.0);
+    QTest::mouseMove(&window.window, at(168.0));
     QCOMPARE(writes.take(), QStringLiteral("0.75 volatile"));
-    move(-5000.0);
+    QTest::mouseMove(&window.window, at(-5000.0));
     QCOMPARE(writes.take(), QStringLiteral("0 volatile"));
-    move(330.0);
+    QTest::mouseMove(&window.window, at(330.0));
     QCOMPARE(writes.take(), QStringLiteral("1 volatile"));
-    release(330.0);
+    QTest::mouseRelease(&window.window, Qt::LeftButton, {}, at(330.0));
     QCOMPARE(writes.take(), QStringLiteral("final"));
 }
 

@@ -1,7 +1,7 @@
 #include "spectrumwindow.h"
 
+#include "../shared/statewrites.h"
 #include "model/colordescription.h"
-#include "platform/observation/publisher.h"
 #include "spectrum/spectrummapping.h"
 #include "spectrum/spectrumview.h"
 
@@ -19,25 +19,6 @@ namespace {
 constexpr QSizeF fieldSize = {360.0, 300.0};
 constexpr auto sRGB = SomeColor::ColorSpace::sRGB;
 constexpr auto displayP3 = SomeColor::ColorSpace::displayP3;
-
-/** Everything written into the state from now on: v and f for the flag, c for a color. */
-class Writes
-{
-public:
-    explicit Writes(service::ColorPickerState &state)
-        : m_flag(state.isVolatile.publisher().sink([this](bool flag) { m_log += flag ? u'v' : u'f'; }))
-        , m_color(state.selectedColor.publisher().sink([this](const std::optional<SomeColor> &) { m_log += u'c'; }))
-    {
-        m_log.clear();
-    }
-
-    QString take() { return std::exchange(m_log, {}); }
-
-private:
-    QString m_log;
-    platform::Subscription m_flag;
-    platform::Subscription m_color;
-};
 
 /** What a touch at a point of the spectrum must select. */
 SomeColor touched(QPointF point, const SomeColor &current)
@@ -98,9 +79,7 @@ private Q_SLOTS:
     void lensMarksTheColor_data();
     void lensMarksTheColor();
     void nothingSelectedShowsNoLens();
-    void secondFingerDoesNotDisturb();
-    void interruptionEndsTheDrag_data();
-    void interruptionEndsTheDrag();
+    void hidingEndsTheDrag();
     void heldKeyIsADrag();
     void keysMoveThePick_data();
     void keysMoveThePick();
@@ -125,21 +104,21 @@ void SpectrumTest::touchIsVolatileThenFinal()
     const SomeColor current(0.2, 0.4, 0.6, 0.5, displayP3);
     SpectrumWindow spectrum(current);
     QVERIFY(spectrum.isReady());
-    Writes writes(spectrum.state);
+    StateWrites writes(spectrum.state);
     const auto touch = [&] { return QTest::touchEvent(&spectrum.window, m_touch.get()); };
     touch().press(0, SpectrumWindow::at(100, 120));
-    QCOMPARE(writes.take(), QStringLiteral("vc"));
+    QCOMPARE(writes.take(), QStringLiteral("volatile color"));
     QCOMPARE(spectrum.state.selectedColor(), std::optional(touched({100.0, 120.0}, current)));
     touch().move(0, SpectrumWindow::at(101, 130));
-    QCOMPARE(writes.take(), QStringLiteral("vc"));
+    QCOMPARE(writes.take(), QStringLiteral("volatile color"));
     QVERIFY(isNear(spectrum.lensCenter(), {101.0, 130.0}));
     // White at every height: the flag is said again, the color is not.
     touch().move(0, SpectrumWindow::at(-5, 40));
     touch().move(0, SpectrumWindow::at(-9, 50));
-    QCOMPARE(writes.take(), QStringLiteral("vcv"));
+    QCOMPARE(writes.take(), QStringLiteral("volatile color volatile"));
     QCOMPARE(spectrum.lensCenter(), std::optional(QPointF(0.0, 50.0)));
     touch().release(0, SpectrumWindow::at(200, 200));
-    QCOMPARE(writes.take(), QStringLiteral("f"));
+    QCOMPARE(writes.take(), QStringLiteral("final"));
     QCOMPARE(spectrum.state.selectedColor(), std::optional(touched({-9.0, 50.0}, current)));
 }
 
@@ -216,48 +195,15 @@ void SpectrumTest::nothingSelectedShowsNoLens()
     QVERIFY(!spectrum.lensCenter());
 }
 
-void SpectrumTest::secondFingerDoesNotDisturb()
+void SpectrumTest::hidingEndsTheDrag()
 {
     SpectrumWindow spectrum;
     QVERIFY(spectrum.isReady());
     const auto touch = [&] { return QTest::touchEvent(&spectrum.window, m_touch.get()); };
     touch().press(0, SpectrumWindow::at(50, 50));
-    Writes writes(spectrum.state);
-    touch().stationary(0).press(1, SpectrumWindow::at(250, 250));
-    touch().stationary(0).move(1, SpectrumWindow::at(260, 260));
-    QCOMPARE(writes.take(), QString());
-    touch().move(0, SpectrumWindow::at(60, 70)).stationary(1);
-    QCOMPARE(writes.take(), QStringLiteral("vc"));
-    touch().stationary(0).release(1, SpectrumWindow::at(260, 260));
-    QCOMPARE(writes.take(), QString());
-    touch().release(0, SpectrumWindow::at(60, 70));
-    QCOMPARE(writes.take(), QStringLiteral("f"));
-}
-
-void SpectrumTest::interruptionEndsTheDrag_data()
-{
-    QTest::addColumn<QString>("interruption");
-    for (const char *interruption : {"cancel", "hidden", "disabled"})
-        QTest::newRow(interruption) << QString::fromLatin1(interruption);
-}
-
-void SpectrumTest::interruptionEndsTheDrag()
-{
-    QFETCH(QString, interruption);
-    SpectrumWindow spectrum;
-    QVERIFY(spectrum.isReady());
-    const auto touch = [&] { return QTest::touchEvent(&spectrum.window, m_touch.get()); };
-    touch().press(0, SpectrumWindow::at(50, 50));
-    Writes writes(spectrum.state);
-    if (interruption == u"cancel") {
-        QTouchEvent cancel(QEvent::TouchCancel, m_touch.get());
-        QCoreApplication::sendEvent(&spectrum.window, &cancel);
-    } else if (interruption == u"hidden") {
-        spectrum.item->setVisible(false);
-    } else {
-        spectrum.item->setEnabled(false);
-    }
-    QCOMPARE(writes.take(), QStringLiteral("f"));
+    StateWrites writes(spectrum.state);
+    spectrum.item->setVisible(false);
+    QCOMPARE(writes.take(), QStringLiteral("final"));
     touch().release(0, SpectrumWindow::at(50, 50));
     QCOMPARE(writes.take(), QString());
 }
@@ -267,19 +213,19 @@ void SpectrumTest::heldKeyIsADrag()
     SpectrumWindow spectrum;
     QVERIFY(spectrum.isReady());
     spectrum.item->forceActiveFocus();
-    Writes writes(spectrum.state);
+    StateWrites writes(spectrum.state);
     QTest::keyPress(&spectrum.window, Qt::Key_Right);
     QTest::keyPress(&spectrum.window, Qt::Key_Right);
     QTest::keyPress(&spectrum.window, Qt::Key_Down);
-    QCOMPARE(writes.take(), QStringLiteral("vcvcvc"));
+    QCOMPARE(writes.take(), QStringLiteral("volatile color volatile color volatile color"));
     QTest::keyRelease(&spectrum.window, Qt::Key_Right);
     QCOMPARE(writes.take(), QString());
     QTest::keyRelease(&spectrum.window, Qt::Key_Down);
-    QCOMPARE(writes.take(), QStringLiteral("f"));
+    QCOMPARE(writes.take(), QStringLiteral("final"));
     QTest::keyPress(&spectrum.window, Qt::Key_Down);
     writes.take();
     spectrum.item->setFocus(false);
-    QCOMPARE(writes.take(), QStringLiteral("f"));
+    QCOMPARE(writes.take(), QStringLiteral("final"));
 }
 
 void SpectrumTest::keysMoveThePick_data()
@@ -323,7 +269,7 @@ void SpectrumTest::emptySpectrumIgnoresTouches()
     QVERIFY(spectrum.isReady());
     spectrum.item->setSize({0.0, 300.0});
     spectrum.item->forceActiveFocus();
-    Writes writes(spectrum.state);
+    StateWrites writes(spectrum.state);
     QMouseEvent press(QEvent::MouseButtonPress, QPointF(0.0, 20.0), QPointF(20.0, 40.0), Qt::LeftButton, Qt::LeftButton,
                       Qt::NoModifier);
     QCoreApplication::sendEvent(spectrum.item, &press);
@@ -382,12 +328,12 @@ void SpectrumTest::axesPickFinally()
     QVERIFY(spectrum.isReady());
     QTest::mouseClick(&spectrum.window, Qt::LeftButton, {}, SpectrumWindow::at(180, 150));
     QAccessibleInterface *element = QAccessible::queryAccessibleInterface(spectrum.item);
-    Writes writes(spectrum.state);
+    StateWrites writes(spectrum.state);
     element->child(0)->valueInterface()->setCurrentValue(120.0);
-    QCOMPARE(writes.take(), QStringLiteral("c"));
+    QCOMPARE(writes.take(), QStringLiteral("color"));
     QCOMPARE(spectrum.item->pickPlace(), QPointF(180.0, 100.0));
     element->child(1)->actionInterface()->doAction(QAccessibleActionInterface::decreaseAction());
-    QCOMPARE(writes.take(), QStringLiteral("c"));
+    QCOMPARE(writes.take(), QStringLiteral("color"));
     QVERIFY(isNear(spectrum.item->pickPlace(), {183.6, 100.0}));
     element->child(0)->valueInterface()->setCurrentValue(qQNaN());
     QCOMPARE(writes.take(), QString());
