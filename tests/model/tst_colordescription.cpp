@@ -31,28 +31,24 @@ QString nameOf(const QString &hex, Space space = Space::sRGB)
 QStringList colorWords(const QString &surveyName)
 {
     static const QHash<QString, QString> plainForms = [] {
-        const QList<QStringList> rows = {
-            {QStringLiteral("red"), QStringLiteral("reddish"), QStringLiteral("reddy"), QStringLiteral("orangered"),
-             QStringLiteral("darkred")},
-            {QStringLiteral("orange"), QStringLiteral("orangish"), QStringLiteral("orangey"),
-             QStringLiteral("orangeish")},
-            {QStringLiteral("yellow"), QStringLiteral("yellowish"), QStringLiteral("yellowy")},
-            {QStringLiteral("green"), QStringLiteral("greenish"), QStringLiteral("greeny"),
-             QStringLiteral("lightgreen"), QStringLiteral("darkgreen"), QStringLiteral("yellowgreen")},
-            {QStringLiteral("blue"), QStringLiteral("bluish"), QStringLiteral("bluey"), QStringLiteral("lightblue"),
-             QStringLiteral("darkblue")},
-            {QStringLiteral("purple"), QStringLiteral("purplish"), QStringLiteral("purpley"), QStringLiteral("purply"),
-             QStringLiteral("purpleish")},
-            {QStringLiteral("pink"), QStringLiteral("pinkish"), QStringLiteral("pinky")},
-            {QStringLiteral("brown"), QStringLiteral("brownish"), QStringLiteral("browny")},
-            {QStringLiteral("gray"), QStringLiteral("grey"), QStringLiteral("greyish"), QStringLiteral("grayish")},
-            {QStringLiteral("black")},
-            {QStringLiteral("white")},
+        const char *const rows[] = {
+            "red reddish reddy orangered darkred",
+            "orange orangish orangey orangeish",
+            "yellow yellowish yellowy",
+            "green greenish greeny lightgreen darkgreen yellowgreen",
+            "blue bluish bluey lightblue darkblue",
+            "purple purplish purpley purply purpleish",
+            "pink pinkish pinky",
+            "brown brownish browny",
+            "gray grey greyish grayish",
+            "black",
+            "white",
         };
         QHash<QString, QString> forms;
-        for (const QStringList &row : rows) {
-            for (const QString &form : row)
-                forms.insert(form, row.first());
+        for (const char *row : rows) {
+            const QStringList words = QString::fromLatin1(row).split(u' ');
+            for (const QString &form : words)
+                forms.insert(form, words.first());
         }
         return forms;
     }();
@@ -69,17 +65,11 @@ QStringList colorWords(const QString &surveyName)
 // Words that mean one kind of a basic color.
 bool isKindOf(const QString &word, const QString &basic)
 {
-    static const QHash<QString, QStringList> kinds = {
-        {QStringLiteral("purple"), {QStringLiteral("lavender"), QStringLiteral("magenta")}},
-        {QStringLiteral("pink"), {QStringLiteral("salmon"), QStringLiteral("magenta")}},
-        {QStringLiteral("blue"), {QStringLiteral("cyan")}},
-        {QStringLiteral("green"), {QStringLiteral("teal")}},
-        {QStringLiteral("red"), {QStringLiteral("maroon")}},
-        {QStringLiteral("brown"), {QStringLiteral("tan"), QStringLiteral("beige")}},
-        {QStringLiteral("orange"), {QStringLiteral("peach")}},
-        {QStringLiteral("yellow"), {QStringLiteral("beige")}},
-    };
-    return word == basic || kinds.value(basic).contains(word);
+    static const QStringList kinds =
+        QStringLiteral("purple/lavender purple/magenta pink/salmon pink/magenta blue/cyan green/teal red/maroon "
+                       "brown/tan brown/beige orange/peach yellow/beige")
+            .split(u' ');
+    return word == basic || kinds.contains(basic + u'/' + word);
 }
 
 struct SurveyEntry
@@ -261,14 +251,14 @@ void ColorDescriptionTest::wordsAndTheirOrderAreTranslated()
     std::set<std::string> asked;
     platform::setStringTable([&asked](std::string_view key) {
         asked.emplace(key);
-        if (key == "%1$@ %2$@")
-            return std::string("%2$@ %1$@ (%%2$ %)");
-        return key == "dark" ? std::string("%2$@") : "<" + std::string(key) + ">";
+        if (key == "dark %@")
+            return std::string("(%%1 %) %@-dark");
+        return key == "red" ? std::string("%@ red") : "<" + std::string(key) + ">";
     });
-    // What a word says is never taken for a place to fill.
-    QCOMPARE(nameOf(QStringLiteral("840000")), QStringLiteral("<red> %2$@ (%%2$ %)"));
+    // What a name says is never taken for a place to fill.
+    QCOMPARE(nameOf(QStringLiteral("840000")), QStringLiteral("(%%1 %) %@ red-dark"));
     QCOMPARE(nameOf(QStringLiteral("FFFFFF")), QStringLiteral("<white>"));
-    QVERIFY(asked == std::set<std::string>({"%1$@ %2$@", "dark", "red", "white"}));
+    QVERIFY(asked == std::set<std::string>({"dark %@", "red", "white"}));
 }
 
 QTEST_APPLESS_MAIN(ColorDescriptionTest)
