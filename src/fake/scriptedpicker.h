@@ -1,0 +1,48 @@
+#pragma once
+
+#include "fake/scriptstep.h"
+#include "host/picker.h"
+
+#include <QPointer>
+
+namespace favrin::fake {
+
+/**
+ * A picker without a process: goes through the states of a real one and plays a script, one step in each turn of the
+ * event loop. Its view is an item without a picture, placed and sized as a real one.
+ */
+class ScriptedPicker : public host::Picker
+{
+    Q_OBJECT
+
+public:
+    using Picker::Picker;
+    ~ScriptedPicker() override;
+
+    void setSelectedColor(const std::optional<platform::Color> &) override {}
+    QSizeF hostWindowSize() const override;
+    double keyboardSpace() const override { return wishes().keyboardSpace.value_or(0.0); }
+
+    void present(host::PresentationStyle style, QQuickItem &place) override;
+    void dismiss() override;
+    QQuickItem *view() const override { return m_view; }
+
+private:
+    void wishesDidChange() override {}
+    void placeView(host::PresentationStyle style, QQuickItem &place);
+    /** In the next turn of the event loop, unless the presentation has ended by then. */
+    void later(void (ScriptedPicker::*action)());
+    void open();
+    void playNextStep();
+    void play(const ScriptStep &step);
+    void pick(const ScriptStep &step);
+    void end(State state);
+    void finish();
+
+    QPointer<QQuickItem> m_view;
+    ScriptSteps m_steps;
+    /** Counts presentations, so that what one has queued does not reach the next. */
+    int m_presentation = 0;
+};
+
+} // namespace favrin::fake
