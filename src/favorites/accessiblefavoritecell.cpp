@@ -5,11 +5,10 @@
 #include "favorites/favoritesstrings.h"
 
 #include <QKeySequence>
-#include <QQuickWindow>
 
 namespace favrin::favorites {
 
-AccessibleFavoriteCell::AccessibleFavoriteCell(FavoriteCell *cell) : QAccessibleObject(cell) {}
+AccessibleFavoriteCell::AccessibleFavoriteCell(FavoriteCell *cell) : AccessibleItem(cell) {}
 
 QString AccessibleFavoriteCell::deleteAction()
 {
@@ -38,11 +37,6 @@ bool AccessibleFavoriteCell::canDelete() const
     return swatch && swatch->canDelete();
 }
 
-QWindow *AccessibleFavoriteCell::window() const
-{
-    return cell()->window();
-}
-
 QAccessibleInterface *AccessibleFavoriteCell::parent() const
 {
     return QAccessible::queryAccessibleInterface(view());
@@ -53,20 +47,13 @@ QString AccessibleFavoriteCell::text(QAccessible::Text kind) const
     return kind == QAccessible::Name ? cell()->accessibilityLabel() : QString();
 }
 
-QRect AccessibleFavoriteCell::rect() const
-{
-    return screenRect(*cell());
-}
-
 QAccessible::State AccessibleFavoriteCell::state() const
 {
-    QAccessible::State state;
+    QAccessible::State state = AccessibleItem::state();
     state.selectable = cell()->saysSelected();
     state.selected = cell()->saysSelected() && cell()->isSelected();
-    state.focusable = true;
     const auto *strip = view();
     state.focused = strip && strip->hasActiveFocus() && place() && place() == strip->focusedPlace();
-    state.invisible = !cell()->isVisible();
     return state;
 }
 
@@ -103,14 +90,6 @@ QStringList AccessibleFavoriteCell::keyBindingsForAction(const QString &actionNa
     if (actionName != deleteAction())
         return {};
     return {QKeySequence(Qt::Key_Delete).toString(QKeySequence::NativeText)};
-}
-
-QRect screenRect(const QQuickItem &item)
-{
-    if (!item.window())
-        return {};
-    const QRectF inWindow = item.mapRectToScene(item.boundingRect());
-    return QRectF(item.window()->mapToGlobal(inWindow.topLeft()), inWindow.size()).toRect();
 }
 
 } // namespace favrin::favorites

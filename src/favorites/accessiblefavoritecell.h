@@ -1,15 +1,14 @@
 #pragma once
 
 #include "favorites/favoritecell.h"
-
-#include <QAccessibleObject>
+#include "platform/accessibility/accessibleitem.h"
 
 namespace favrin::favorites {
 
 class FavoriteColorPickerView;
 
 /** One cell as assistive technologies see it: a button, which deletes too where the color can be deleted. */
-class AccessibleFavoriteCell : public QAccessibleObject, public QAccessibleActionInterface
+class AccessibleFavoriteCell : public platform::AccessibleItem, public QAccessibleActionInterface
 {
 public:
     explicit AccessibleFavoriteCell(FavoriteCell *cell);
@@ -17,13 +16,8 @@ public:
     /** The name of the delete action. */
     static QString deleteAction();
 
-    QWindow *window() const override;
     QAccessibleInterface *parent() const override;
-    QAccessibleInterface *child(int) const override { return nullptr; }
-    int childCount() const override { return 0; }
-    int indexOfChild(const QAccessibleInterface *) const override { return -1; }
     QString text(QAccessible::Text kind) const override;
-    QRect rect() const override;
     QAccessible::Role role() const override { return QAccessible::Button; }
     QAccessible::State state() const override;
     void *interface_cast(QAccessible::InterfaceType type) override;
@@ -34,13 +28,10 @@ public:
     QStringList keyBindingsForAction(const QString &actionName) const override;
 
 private:
-    FavoriteCell *cell() const { return static_cast<FavoriteCell *>(object()); }
+    FavoriteCell *cell() const { return static_cast<FavoriteCell *>(item()); }
     FavoriteColorPickerView *view() const;
     std::optional<int> place() const;
     bool canDelete() const;
 };
-
-/** The area of an item in the coordinates of the screen. */
-QRect screenRect(const QQuickItem &item);
 
 } // namespace favrin::favorites

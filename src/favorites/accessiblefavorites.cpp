@@ -3,36 +3,24 @@
 #include "favorites/accessiblefavoritecell.h"
 #include "favorites/favoritecolorpickerview.h"
 #include "favorites/favoritesstrings.h"
-
-#include <QAccessibleObject>
-#include <QQuickWindow>
+#include "platform/accessibility/accessibleitem.h"
+#include "platform/accessibility/screenrect.h"
 
 #include <algorithm>
 
 namespace favrin::favorites {
 namespace {
 
-class AccessibleFavorites : public QAccessibleObject
+class AccessibleFavorites : public platform::AccessibleItem
 {
 public:
-    explicit AccessibleFavorites(FavoriteColorPickerView *view) : QAccessibleObject(view)
+    explicit AccessibleFavorites(FavoriteColorPickerView *view) : AccessibleItem(view)
     {
         // This object exists only where somebody asked for it, so there is somebody to hear.
         QObject::connect(view, &FavoriteColorPickerView::focusFrameChanged, &m_context, [this] { announceFocus(); });
         // It may be asked for before the strip has its cells.
         QObject::connect(view, &FavoriteColorPickerView::collectionViewChanged, &m_context, [this] { followCells(); });
         followCells();
-    }
-
-    QWindow *window() const override { return view()->window(); }
-
-    QAccessibleInterface *parent() const override
-    {
-        for (QQuickItem *item = view()->parentItem(); item; item = item->parentItem()) {
-            if (QAccessibleInterface *interface = QAccessible::queryAccessibleInterface(item))
-                return interface;
-        }
-        return QAccessible::queryAccessibleInterface(window());
     }
 
     int childCount() const override { return static_cast<int>(elements().size()); }
@@ -55,8 +43,8 @@ public:
     QAccessibleInterface *childAt(int x, int y) const override
     {
         const auto cells = elements();
-        const auto found =
-            std::ranges::find_if(cells, [x, y](const FavoriteCell *cell) { return screenRect(*cell).contains(x, y); });
+        const auto found = std::ranges::find_if(
+            cells, [x, y](const FavoriteCell *cell) { return platform::screenRect(*cell).contains(x, y); });
         return found != cells.end() ? QAccessible::queryAccessibleInterface(*found) : nullptr;
     }
 
@@ -72,21 +60,17 @@ public:
         return kind == QAccessible::Name ? FavoritesStrings::favorites() : QString();
     }
 
-    QRect rect() const override { return screenRect(*view()); }
     QAccessible::Role role() const override { return QAccessible::List; }
 
     QAccessible::State state() const override
     {
-        QAccessible::State state;
-        state.focusable = true;
-        state.focused = view()->hasActiveFocus();
+        QAccessible::State state = AccessibleItem::state();
         state.multiSelectable = true;
-        state.invisible = !view()->isVisible();
         return state;
     }
 
 private:
-    FavoriteColorPickerView *view() const { return static_cast<FavoriteColorPickerView *>(object()); }
+    FavoriteColorPickerView *view() const { return static_cast<FavoriteColorPickerView *>(item()); }
 
     std::vector<FavoriteCell *> elements() const
     {
