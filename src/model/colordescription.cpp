@@ -1,7 +1,6 @@
 #include "model/colordescription.h"
 
 #include "model/coloranchors.h"
-#include "platform/strings/localizedstring.h"
 
 #include <cmath>
 #include <string_view>
@@ -57,20 +56,12 @@ ColorTerm termOf(const Oklab &color)
     return color.lightness < whiteLightness ? tintedGray(color.hue()) : ColorTerm::White;
 }
 
-// %1$@ and %2$@ are numbered, so that a translation can put them in its own order.
-std::string filledIn(std::string format, const std::string &first, const std::string &second)
+std::string filledIn(std::string format, const std::string &name)
 {
-    std::string text;
-    for (std::size_t i = 0; i < format.size();) {
-        const std::string_view rest = std::string_view(format).substr(i, 4);
-        if (rest == "%1$@" || rest == "%2$@") {
-            text += rest[1] == '1' ? first : second;
-            i += rest.size();
-        } else {
-            text += format[i++];
-        }
-    }
-    return text;
+    constexpr std::string_view placeholder = "%@";
+    if (const std::size_t place = format.find(placeholder); place != std::string::npos)
+        format.replace(place, placeholder.size(), name);
+    return format;
 }
 
 } // namespace
@@ -81,10 +72,7 @@ std::string colorDescription(const platform::Color &color)
     const ColorTerm term = termOf(oklab);
     if (term == ColorTerm::Black || term == ColorTerm::White)
         return localizedName(term);
-    const std::string format = platform::localizedString(
-        "%1$@ %2$@",
-        "A color as it is spoken: %1$@ is its lightness, such as \"dark\", %2$@ its name, such as \"blue\".");
-    return filledIn(format, localizedName(lightnessTerm(term, oklab.lightness, oklab.chroma())), localizedName(term));
+    return filledIn(localizedFormat(lightnessTerm(term, oklab.lightness, oklab.chroma())), localizedName(term));
 }
 
 } // namespace favrin::model

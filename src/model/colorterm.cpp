@@ -9,6 +9,13 @@ namespace favrin::model {
 
 namespace {
 
+using platform::localizable;
+
+constexpr std::string_view termComment =
+    "Name of a color, spoken alone or within \"dark %@\" and the like: all names in one form that fits there.";
+constexpr std::string_view lightnessComment =
+    "Lightness of a color; %@ is its name, such as \"blue\". In one form that fits all the names.";
+
 constexpr double never = 9.0;
 
 // Below veryDark and dark, from light and veryLight on, and from bright on by chroma, a color gets the word.
@@ -36,47 +43,47 @@ constexpr Limits brownLimits = {0.22, 0.37, 0.57, 0.75, never};
 constexpr Limits pinkLimits = {0.40, 0.61, 0.80, 0.91, 0.20};
 
 constexpr auto entries = std::to_array<TermEntry>({
-    {ColorTerm::Beige, "beige", {0.50, 0.78, 0.90, 0.97, never}},
-    {ColorTerm::Black, "black", grayLimits},
-    {ColorTerm::Blue, "blue", blueLimits},
-    {ColorTerm::BluishGray, "bluish gray", grayLimits},
-    {ColorTerm::BluishGreen, "bluish green", {0.25, 0.55, 0.77, 0.91, 0.16}},
-    {ColorTerm::BluishPurple, "bluish purple", purpleLimits},
-    {ColorTerm::Brown, "brown", brownLimits},
-    {ColorTerm::BrownishGray, "brownish gray", grayLimits},
-    {ColorTerm::Cyan, "cyan", {0.40, 0.65, 0.90, 0.95, 0.12}},
-    {ColorTerm::Gray, "gray", grayLimits},
-    {ColorTerm::GrayishBlue, "grayish blue", {0.25, 0.50, 0.70, 0.88, never}},
-    {ColorTerm::GrayishGreen, "grayish green", {0.25, 0.52, 0.75, 0.90, never}},
-    {ColorTerm::Green, "green", greenLimits},
-    {ColorTerm::GreenishGray, "greenish gray", grayLimits},
-    {ColorTerm::Lavender, "lavender", {0.40, 0.63, 0.80, 0.92, never}},
-    {ColorTerm::LimeGreen, "lime green", {0.40, 0.74, 0.88, 0.95, 0.19}},
-    {ColorTerm::Magenta, "magenta", {0.30, 0.49, 0.74, 0.88, 0.23}},
-    {ColorTerm::Maroon, "maroon", {0.24, 0.40, 0.50, 0.65, never}},
-    {ColorTerm::MintGreen, "mint green", {0.50, 0.78, 0.89, 0.96, never}},
-    {ColorTerm::NavyBlue, "navy blue", {0.19, 0.42, 0.50, 0.70, never}},
-    {ColorTerm::OliveGreen, "olive green", {0.28, 0.48, 0.68, 0.86, never}},
-    {ColorTerm::Orange, "orange", {0.45, 0.63, 0.79, 0.90, 0.175}},
-    {ColorTerm::Peach, "peach", {0.50, 0.75, 0.87, 0.95, never}},
-    {ColorTerm::Pink, "pink", pinkLimits},
-    {ColorTerm::PinkishGray, "pinkish gray", grayLimits},
-    {ColorTerm::Purple, "purple", purpleLimits},
-    {ColorTerm::PurplishBlue, "purplish blue", blueLimits},
-    {ColorTerm::PurplishGray, "purplish gray", grayLimits},
-    {ColorTerm::PurplishPink, "purplish pink", pinkLimits},
-    {ColorTerm::Red, "red", {0.26, 0.50, 0.66, 0.80, 0.21}},
-    {ColorTerm::ReddishBrown, "reddish brown", brownLimits},
-    {ColorTerm::Salmon, "salmon", {0.45, 0.66, 0.78, 0.90, never}},
-    {ColorTerm::SkyBlue, "sky blue", {0.40, 0.68, 0.78, 0.90, never}},
-    {ColorTerm::Tan, "tan", {0.45, 0.70, 0.82, 0.93, never}},
-    {ColorTerm::Teal, "teal", {0.30, 0.53, 0.73, 0.88, 0.14}},
-    {ColorTerm::Turquoise, "turquoise", {0.40, 0.62, 0.86, 0.94, 0.13}},
-    {ColorTerm::White, "white", grayLimits},
-    {ColorTerm::Yellow, "yellow", {0.55, 0.84, 0.87, 0.975, 0.168}},
-    {ColorTerm::YellowishBrown, "yellowish brown", {0.28, 0.45, 0.65, 0.80, never}},
-    {ColorTerm::YellowishGray, "yellowish gray", grayLimits},
-    {ColorTerm::YellowishGreen, "yellowish green", {0.30, 0.60, 0.80, 0.94, 0.205}},
+    {ColorTerm::Beige, localizable("beige", termComment), {0.50, 0.78, 0.90, 0.97, never}},
+    {ColorTerm::Black, localizable("black", termComment), grayLimits},
+    {ColorTerm::Blue, localizable("blue", termComment), blueLimits},
+    {ColorTerm::BluishGray, localizable("bluish gray", termComment), grayLimits},
+    {ColorTerm::BluishGreen, localizable("bluish green", termComment), {0.25, 0.55, 0.77, 0.91, 0.16}},
+    {ColorTerm::BluishPurple, localizable("bluish purple", termComment), purpleLimits},
+    {ColorTerm::Brown, localizable("brown", termComment), brownLimits},
+    {ColorTerm::BrownishGray, localizable("brownish gray", termComment), grayLimits},
+    {ColorTerm::Cyan, localizable("cyan", termComment), {0.40, 0.65, 0.90, 0.95, 0.12}},
+    {ColorTerm::Gray, localizable("gray", termComment), grayLimits},
+    {ColorTerm::GrayishBlue, localizable("grayish blue", termComment), {0.25, 0.50, 0.70, 0.88, never}},
+    {ColorTerm::GrayishGreen, localizable("grayish green", termComment), {0.25, 0.52, 0.75, 0.90, never}},
+    {ColorTerm::Green, localizable("green", termComment), greenLimits},
+    {ColorTerm::GreenishGray, localizable("greenish gray", termComment), grayLimits},
+    {ColorTerm::Lavender, localizable("lavender", termComment), {0.40, 0.63, 0.80, 0.92, never}},
+    {ColorTerm::LimeGreen, localizable("lime green", termComment), {0.40, 0.74, 0.88, 0.95, 0.19}},
+    {ColorTerm::Magenta, localizable("magenta", termComment), {0.30, 0.49, 0.74, 0.88, 0.23}},
+    {ColorTerm::Maroon, localizable("maroon", termComment), {0.24, 0.40, 0.50, 0.65, never}},
+    {ColorTerm::MintGreen, localizable("mint green", termComment), {0.50, 0.78, 0.89, 0.96, never}},
+    {ColorTerm::NavyBlue, localizable("navy blue", termComment), {0.19, 0.42, 0.50, 0.70, never}},
+    {ColorTerm::OliveGreen, localizable("olive green", termComment), {0.28, 0.48, 0.68, 0.86, never}},
+    {ColorTerm::Orange, localizable("orange", termComment), {0.45, 0.63, 0.79, 0.90, 0.175}},
+    {ColorTerm::Peach, localizable("peach", termComment), {0.50, 0.75, 0.87, 0.95, never}},
+    {ColorTerm::Pink, localizable("pink", termComment), pinkLimits},
+    {ColorTerm::PinkishGray, localizable("pinkish gray", termComment), grayLimits},
+    {ColorTerm::Purple, localizable("purple", termComment), purpleLimits},
+    {ColorTerm::PurplishBlue, localizable("purplish blue", termComment), blueLimits},
+    {ColorTerm::PurplishGray, localizable("purplish gray", termComment), grayLimits},
+    {ColorTerm::PurplishPink, localizable("purplish pink", termComment), pinkLimits},
+    {ColorTerm::Red, localizable("red", termComment), {0.26, 0.50, 0.66, 0.80, 0.21}},
+    {ColorTerm::ReddishBrown, localizable("reddish brown", termComment), brownLimits},
+    {ColorTerm::Salmon, localizable("salmon", termComment), {0.45, 0.66, 0.78, 0.90, never}},
+    {ColorTerm::SkyBlue, localizable("sky blue", termComment), {0.40, 0.68, 0.78, 0.90, never}},
+    {ColorTerm::Tan, localizable("tan", termComment), {0.45, 0.70, 0.82, 0.93, never}},
+    {ColorTerm::Teal, localizable("teal", termComment), {0.30, 0.53, 0.73, 0.88, 0.14}},
+    {ColorTerm::Turquoise, localizable("turquoise", termComment), {0.40, 0.62, 0.86, 0.94, 0.13}},
+    {ColorTerm::White, localizable("white", termComment), grayLimits},
+    {ColorTerm::Yellow, localizable("yellow", termComment), {0.55, 0.84, 0.87, 0.975, 0.168}},
+    {ColorTerm::YellowishBrown, localizable("yellowish brown", termComment), {0.28, 0.45, 0.65, 0.80, never}},
+    {ColorTerm::YellowishGray, localizable("yellowish gray", termComment), grayLimits},
+    {ColorTerm::YellowishGreen, localizable("yellowish green", termComment), {0.30, 0.60, 0.80, 0.94, 0.205}},
 });
 
 constexpr bool isInOrderOfTerms()
@@ -112,14 +119,17 @@ LightnessTerm lightnessTerm(ColorTerm term, double lightness, double chroma)
 
 std::string localizedName(ColorTerm term)
 {
-    return platform::localizedString(entryOf(term).key, "Name of a color, spoken after a lightness word.");
+    return platform::localizedString(entryOf(term).key, termComment);
 }
 
-std::string localizedName(LightnessTerm term)
+std::string localizedFormat(LightnessTerm term)
 {
-    constexpr std::array<std::string_view, 6> keys = {"very dark", "dark", "medium", "bright", "light", "very light"};
-    return platform::localizedString(keys[static_cast<std::size_t>(term)],
-                                     "Lightness of a color, spoken before the color's name.");
+    constexpr std::array formats = {
+        localizable("very dark %@", lightnessComment), localizable("dark %@", lightnessComment),
+        localizable("medium %@", lightnessComment),    localizable("bright %@", lightnessComment),
+        localizable("light %@", lightnessComment),     localizable("very light %@", lightnessComment),
+    };
+    return platform::localizedString(formats[static_cast<std::size_t>(term)], lightnessComment);
 }
 
 } // namespace favrin::model

@@ -58,8 +58,13 @@ enum class LightnessTerm { VeryDark, Dark, Medium, Bright, Light, VeryLight };
  */
 LightnessTerm lightnessTerm(ColorTerm term, double lightness, double chroma);
 
-/** The words in the user's language. Any thread. */
+/** The word in the user's language. Any thread. */
 std::string localizedName(ColorTerm term);
-std::string localizedName(LightnessTerm term);
+
+/**
+ * What is said of a color, in the user's language, with "%@" where its name goes. One format for each lightness lets a
+ * language put it before or after the name, or write both as one word. Any thread.
+ */
+std::string localizedFormat(LightnessTerm term);
 
 } // namespace favrin::model

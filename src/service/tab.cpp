@@ -6,15 +6,21 @@
 
 namespace favrin::service {
 
+namespace {
+
+constexpr std::string_view titleComment = "Title of the tab.";
+
+}
+
 std::string_view rawValue(Tab tab)
 {
     switch (tab) {
     case Tab::grid:
-        return "Grid";
+        return platform::localizable("Grid", titleComment);
     case Tab::spectrum:
-        return "Spectrum";
+        return platform::localizable("Spectrum", titleComment);
     case Tab::sliders:
-        return "Sliders";
+        return platform::localizable("Sliders", titleComment);
     }
     return {};
 }
@@ -27,7 +33,7 @@ std::optional<Tab> tabFromRawValue(std::string_view text)
 
 std::string localizedTitle(Tab tab)
 {
-    return platform::localizedString(rawValue(tab), "Title of the tab.");
+    return platform::localizedString(rawValue(tab), titleComment);
 }
 
 } // namespace favrin::service

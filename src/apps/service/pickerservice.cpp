@@ -89,7 +89,8 @@ void PickerService::applySurroundings(const remote::Traits &traits)
     if (!m_traits || m_traits->locale != traits.locale) {
         const auto name = QString::fromStdString(traits.locale);
         QLocale::setDefault(name.isEmpty() ? QLocale::system() : QLocale(name));
-        platform::installTranslations(QLocale().bcp47Name());
+        // By the name itself: what the library knows no numbers and dates for may still have a translation.
+        platform::installTranslations(name.isEmpty() ? QLocale().bcp47Name() : name);
     }
     const auto direction =
         traits.layoutDirection == remote::LayoutDirection::RightToLeft ? Qt::RightToLeft : Qt::LeftToRight;

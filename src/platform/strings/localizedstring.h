@@ -16,6 +16,15 @@ using StringTable = std::function<std::string(std::string_view key)>;
  */
 std::string localizedString(std::string_view key, std::string_view comment);
 
+/**
+ * Marks a key that localizedString() is given by a variable, so that tools/strings finds it with its comment. Yields
+ * the key.
+ */
+constexpr std::string_view localizable(std::string_view key, [[maybe_unused]] std::string_view comment)
+{
+    return key;
+}
+
 /** Installs the table that localizedString() asks; an empty function removes it. Call on the main thread. */
 void setStringTable(StringTable table);
 

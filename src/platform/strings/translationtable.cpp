@@ -1,12 +1,15 @@
 #include "platform/strings/translationtable.h"
 
+#include "platform/strings/languagematch.h"
 #include "platform/strings/localizedstring.h"
 
-#include <QString>
+#include <QDir>
 #include <QTranslator>
 
 #include <algorithm>
 #include <memory>
+#include <string>
+#include <vector>
 
 namespace favrin::platform {
 
@@ -20,16 +23,35 @@ bool isLanguageTag(QStringView tag)
     });
 }
 
-std::shared_ptr<const QTranslator> translatorFor(QStringView locale)
+const QString &folder()
+{
+    static const QString path = QStringLiteral(":/favrin/translations");
+    return path;
+}
+
+std::shared_ptr<const QTranslator> translatorFor(const QString &tag)
 {
     auto translator = std::make_shared<QTranslator>();
-    for (QStringView tag = locale; isLanguageTag(tag); tag = tag.left(tag.lastIndexOf(u'-'))) {
-        if (translator->load(QStringLiteral(":/favrin/translations/Localizable_%1.qm").arg(tag)))
-            return translator;
-        if (!tag.contains(u'-'))
-            break;
-    }
-    return nullptr;
+    if (!isLanguageTag(tag) || !translator->load(QStringLiteral("Localizable_%1.qm").arg(tag), folder(), {}, {}))
+        return nullptr;
+    return translator;
+}
+
+std::vector<std::string> availableLanguages()
+{
+    constexpr int before = std::char_traits<char>::length("Localizable_");
+    constexpr int after = std::char_traits<char>::length(".qm");
+    std::vector<std::string> tags;
+    for (const QString &name : QDir(folder()).entryList({QStringLiteral("Localizable_*.qm")}, QDir::Files, QDir::Name))
+        tags.push_back(name.chopped(after).mid(before).toStdString());
+    return tags;
+}
+
+QString bestLanguageFor(QStringView locale)
+{
+    if (!isLanguageTag(locale))
+        return {};
+    return QString::fromStdString(bestLanguage(locale.toString().toStdString(), availableLanguages()));
 }
 
 std::string translated(const QTranslator &translator, std::string_view key)
@@ -41,15 +63,21 @@ std::string translated(const QTranslator &translator, std::string_view key)
 
 } // namespace
 
-TranslationLoading installTranslations(QStringView locale)
+QString installTranslations(QStringView locale)
 {
-    const std::shared_ptr<const QTranslator> translator = translatorFor(locale);
+    // Most locales have a file of their own name; looking for the best one costs more than reading it.
+    QString tag = locale.toString();
+    std::shared_ptr<const QTranslator> translator = translatorFor(tag);
+    if (!translator)
+        translator = translatorFor(tag = bestLanguageFor(locale));
+    if (!translator)
+        translator = translatorFor(tag = QStringLiteral("en"));
     if (!translator) {
         setStringTable({});
-        return TranslationLoading::NotFound;
+        return {};
     }
     setStringTable([translator](std::string_view key) { return translated(*translator, key); });
-    return TranslationLoading::Loaded;
+    return tag;
 }
 
 } // namespace favrin::platform

@@ -1,19 +1,19 @@
 #pragma once
 
-#include <QStringView>
+#include <QString>
 
 namespace favrin::platform {
 
-enum class TranslationLoading { Loaded, NotFound };
-
 /**
  * Installs the translations of the table "Localizable" for @p locale (BCP 47, such as "de" or "pt-BR") as the string
- * table. They are the resource ":/favrin/translations/Localizable_<locale>.qm"; without one for the whole tag, its
- * leading subtags are tried, so that "de-AT" finds "de". In the file the context is "Localizable" and the source text
- * the key.
+ * table and yields the tag of the language they are in.
  *
- * Without a file, or for a tag that is none, the table is removed, so that every key yields itself. Main thread.
+ * Translations are the resources ":/favrin/translations/Localizable_<tag>.qm"; in a file the context is "Localizable"
+ * and the source text the key. Of these the language is taken that readers of @p locale read best, so that "de-AT"
+ * finds "de"; when none comes near, or @p locale is no tag, English. Of all files only that one is read.
+ *
+ * Without even English the table is removed, so that every key yields itself, and the tag is empty. Main thread.
  */
-TranslationLoading installTranslations(QStringView locale);
+QString installTranslations(QStringView locale);
 
 } // namespace favrin::platform
