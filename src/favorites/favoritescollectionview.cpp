@@ -152,11 +152,10 @@ void FavoritesCollectionView::applied(Animation animation)
 
 void FavoritesCollectionView::layOutCells(Reach reach)
 {
-    auto [first, end] = m_layout.visiblePlaces(m_offset, itemCount());
-    if (reach == Reach::Neighbourhood) {
-        first = std::max(first - m_layout.swatchesPerPage(), 0);
-        end = std::min(end + m_layout.swatchesPerPage(), itemCount());
-    }
+    const auto visible = m_layout.visiblePlaces(m_offset, itemCount());
+    const int around = reach == Reach::Neighbourhood ? m_layout.swatchesPerPage() : 0;
+    const int first = std::max(visible.first - around, 0);
+    const int end = std::min(visible.second + around, itemCount());
     std::erase_if(m_cells, [&](const ShownCell &shown) { return shown.place() < first || shown.place() >= end; });
     addMissingCells({first, end});
     placeCells();

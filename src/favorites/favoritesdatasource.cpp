@@ -1,7 +1,7 @@
 #include "favorites/favoritesdatasource.h"
 
+#include <algorithm>
 #include <iterator>
-#include <ranges>
 
 namespace favrin::favorites {
 
@@ -16,8 +16,8 @@ void FavoritesDataSource::apply(ItemList items, Animation animation)
     if (difference.isEmpty())
         return;
     Q_EMIT willApply(animation);
-    for (const PlaceRange &range : difference.removals | std::views::reverse)
-        remove(range);
+    std::for_each(difference.removals.rbegin(), difference.removals.rend(),
+                  [this](const PlaceRange &range) { remove(range); });
     if (!difference.order.empty())
         reorder(difference.order);
     for (const PlaceRange &range : difference.insertions)

@@ -81,7 +81,9 @@ int PageLayout::restingPage(double offset, double velocity, int startPage, int i
 QRectF PageLayout::frame(int place) const
 {
     const int onPage = place % swatchesPerPage();
-    const QPointF topLeft(offsetOf(pageOf(place)) + onPage % m_columns * pitch(), onPage / m_columns * pitch());
+    const int row = onPage / m_columns;
+    const int column = onPage % m_columns;
+    const QPointF topLeft(offsetOf(pageOf(place)) + column * pitch(), row * pitch());
     return {topLeft, QSizeF(m_metrics.size, m_metrics.size)};
 }
 

@@ -3,13 +3,14 @@
 #include <QColor>
 
 #include <algorithm>
+#include <cmath>
 
 namespace favrin::sliders {
 namespace {
 
 quint16 sixteenBits(double component)
 {
-    return static_cast<quint16>(std::clamp(component, 0.0, 1.0) * 0xffff + 0.5);
+    return static_cast<quint16>(std::lround(std::clamp(component, 0.0, 1.0) * 0xffff));
 }
 
 } // namespace
