@@ -13,6 +13,7 @@ T.Menu {
     readonly property real gap: 6
     /* The middle of the cell, in the parent's coordinates. */
     property real targetX: 0
+    readonly property CalloutBubble bubble: CalloutBubble { arrowX: menu.targetX - menu.x }
 
     function openAt(item: Item, cell: rect) {
         parent = item;
@@ -37,11 +38,7 @@ T.Menu {
         currentIndex: menu.currentIndex
     }
 
-    background: CalloutBubble {
-        id: bubble
-
-        arrowX: menu.targetX - menu.x
-    }
+    background: bubble
 
     T.MenuItem {
         id: command
