@@ -45,8 +45,6 @@ private Q_SLOTS:
     void markIgnoresOpacityAndSelectionDoesNot_data();
     void markIgnoresOpacityAndSelectionDoesNot();
     void firstOfEqualSwatchesIsMarked();
-    void pickKeepsOpacityAndSpace();
-    void nearestCellIsFound();
     void cellsTileThePixels_data();
     void cellsTileThePixels();
     void markerOutlineHasTwoRadii_data();
@@ -179,21 +177,6 @@ void GridRulesTest::firstOfEqualSwatchesIsMarked()
     palette[6][2] = palette[8][1];
     palette[6][7] = palette[8][1];
     QCOMPARE(text(markedCell(palette[8][1], palette)), QStringLiteral("6,2"));
-}
-
-void GridRulesTest::pickKeepsOpacityAndSpace()
-{
-    const SomeColor current(0.1, 0.2, 0.3, 0.5, SomeColor::ColorSpace::displayP3);
-    const SomeColor color = picked(swatch(5, 5), current);
-    QCOMPARE(color, swatch(5, 5).inDisplayP3().setting(SomeColor::Component::a, 0.5));
-    QVERIFY(color != swatch(5, 5));
-}
-
-void GridRulesTest::nearestCellIsFound()
-{
-    SomeColor color = swatch(3, 7);
-    color.r += 0.01;
-    QCOMPARE(text(nearestCell(color, defaultColorMatrix())), QStringLiteral("3,7"));
 }
 
 void GridRulesTest::cellsTileThePixels_data()

@@ -71,15 +71,10 @@ void SliderControlStylesTest::everyShownTextMeansItsValue_data()
                               << QString::fromUtf8(percentage);
     };
     row("en", "128", "50%");
-    row("de", "128", "50\u00a0%");
-    row("fr-CH", "128", "50%");
     row("tr", "128", "%50");
-    row("eu", "128", "%\u00a050");
     row("ar-EG", "١٢٨", "٥٠٪\u061c");
     row("fa", "۱۲۸", "۵۰٪");
     row("mr", "१२८", "५०%");
-    row("bn", "১২৮", "৫০%");
-    row("he", "128", "50%");
 }
 
 void SliderControlStylesTest::everyShownTextMeansItsValue()
@@ -123,16 +118,12 @@ void SliderControlStylesTest::integersAreRead_data()
     QTest::addColumn<QString>("text");
     QTest::addColumn<Value>("value");
     const auto row = [](const char *text, Value value) { QTest::newRow(text) << QString::fromUtf8(text) << value; };
-    row("0", 0.0);
-    row("1", 1 / 255.0);
-    row("007", 7 / 255.0);
     row("255", 1.0);
     row("300", 1.0);
     row("99999999999999999999999999", 1.0);
     row("१२८", 128 / 255.0);
     row("", std::nullopt);
     row("12%", std::nullopt);
-    row("x", std::nullopt);
     row("-1", 0.0);
 }
 

@@ -24,7 +24,6 @@ private Q_SLOTS:
     void locationsMeanValues();
     void thumbStandsWhereItsValueIs();
     void stopsAreTheEndsOfTheComponent();
-    void stepsEndAtTheEnds();
     void keysMeanValues_data();
     void keysMeanValues();
     void checkerboardCoversTheArea();
@@ -79,14 +78,6 @@ void SliderRulesTest::stopsAreTheEndsOfTheComponent()
             Stops(SomeColor(0.1, 0.2, 0.3, 0.0, Space::displayP3), SomeColor(0.1, 0.2, 0.3, 1.0, Space::displayP3)));
     QVERIFY(gradientStops(std::nullopt, Component::b) ==
             Stops(SomeColor(0.0, 0.0, 0.0, 1.0, Space::sRGB), SomeColor(0.0, 0.0, 1.0, 1.0, Space::sRGB)));
-}
-
-void SliderRulesTest::stepsEndAtTheEnds()
-{
-    QCOMPARE(incremented(0.95), 1.0);
-    QCOMPARE(incremented(0.25), 0.35);
-    QCOMPARE(decremented(0.05), 0.0);
-    QCOMPARE(decremented(0.25), 0.15);
 }
 
 void SliderRulesTest::keysMeanValues_data()
