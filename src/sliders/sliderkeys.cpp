@@ -1,12 +1,12 @@
 #include "sliders/sliderkeys.h"
 
+#include "sliders/sliderrules.h"
+
 #include <algorithm>
 #include <cmath>
 
 namespace favrin::sliders {
 namespace {
-
-constexpr double page = 0.1;
 
 /** 1 for an arrow to more, -1 for one to less, 0 for any other key. */
 int arrowDirection(int key, Qt::LayoutDirection direction)
@@ -37,9 +37,9 @@ std::optional<double> valueForKey(int key, Qt::KeyboardModifiers modifiers, doub
         return std::clamp((std::round(value * shownSteps) + step) / shownSteps, 0.0, 1.0);
     switch (key) {
     case Qt::Key_PageUp:
-        return std::min(value + page, 1.0);
+        return incremented(value);
     case Qt::Key_PageDown:
-        return std::max(value - page, 0.0);
+        return decremented(value);
     case Qt::Key_Home:
         return 0.0;
     case Qt::Key_End:

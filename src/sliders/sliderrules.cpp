@@ -9,7 +9,7 @@ using Component = SomeColor::Component;
 
 namespace {
 
-constexpr double accessibilityStep = 0.1;
+constexpr double largeStep = 0.1;
 
 } // namespace
 
@@ -40,12 +40,12 @@ std::pair<SomeColor, SomeColor> gradientStops(const std::optional<SomeColor> &se
 
 double incremented(double value)
 {
-    return std::min(value + accessibilityStep, 1.0);
+    return std::min(value + largeStep, 1.0);
 }
 
 double decremented(double value)
 {
-    return std::max(value - accessibilityStep, 0.0);
+    return std::max(value - largeStep, 0.0);
 }
 
 int shownSteps(Component component)

@@ -31,7 +31,7 @@ QPointF thumbCenter(double value, QSizeF size, Qt::LayoutDirection direction);
 std::pair<model::SomeColor, model::SomeColor> gradientStops(const std::optional<model::SomeColor> &selectedColor,
                                                             model::SomeColor::Component component);
 
-/** What assistive technologies step by. */
+/** What assistive technologies and the page keys step by, within 0 to 1. */
 double incremented(double value);
 double decremented(double value);
 
