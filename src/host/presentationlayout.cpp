@@ -27,7 +27,8 @@ PresentationLayout sheet(QSizeF window, QSizeF preferred)
 {
     const double height = fitted(preferred, window).height();
     return {.panel = QRectF(0, window.height() - height, window.width(), height),
-            .topRadius = cornerRadius,
+            // Nothing of the window is left above a sheet that fills it.
+            .topRadius = height < window.height() ? cornerRadius : 0,
             .bottomRadius = 0,
             .arrowEdge = ArrowEdge::None,
             .arrowTip = {}};

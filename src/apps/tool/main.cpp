@@ -1,0 +1,104 @@
+#include "apps/tool/pickertool.h"
+#include "apps/tool/windowparent.h"
+
+#include <QGuiApplication>
+
+#include <csignal>
+#include <cstdio>
+
+using namespace favrin::tool;
+
+namespace {
+
+void say(const QString &text)
+{
+    std::fprintf(stderr, "favrin-color-picker: %s\n", qUtf8Printable(text));
+}
+
+bool printLine(const std::string &line)
+{
+    return std::fprintf(stdout, "%s\n", line.c_str()) >= 0 && std::fflush(stdout) == 0;
+}
+
+QStringList texts(int count, char **arguments)
+{
+    QStringList list;
+    for (int i = 0; i < count; ++i)
+        list.append(QString::fromLocal8Bit(arguments[i]));
+    return list;
+}
+
+void setDefault(const char *variable, const QByteArray &value)
+{
+    if (qEnvironmentVariableIsEmpty(variable))
+        qputenv(variable, value);
+}
+
+/** The platforms to try, best first. The last one always starts, and tells that the others did not. */
+QByteArray platforms(const ParentHandle &parent)
+{
+    const bool hasWayland = !qEnvironmentVariableIsEmpty("WAYLAND_DISPLAY");
+    const bool hasX11 = !qEnvironmentVariableIsEmpty("DISPLAY");
+    QByteArrayList list;
+    if (hasWayland)
+        list.append("wayland");
+    if (hasX11)
+        list.insert(std::holds_alternative<X11Window>(parent) ? 0 : list.size(), "xcb");
+    list.append("offscreen");
+    return list.join(';');
+}
+
+/** What Qt must know before it starts: nothing that the first frame does not need. */
+void prepareEnvironment(const ParentHandle &parent)
+{
+    setDefault("QT_QPA_PLATFORM", platforms(parent));
+    // Qt otherwise waits 5 ms before each frame, which a drag over the picker would show.
+    setDefault("QT_QPA_UPDATE_IDLE_TIME", "0");
+    setDefault("QSG_RENDER_LOOP", "basic");
+    QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
+    QGuiApplication::setApplicationName(QStringLiteral("favrin-color-picker"));
+    QGuiApplication::setApplicationDisplayName(QStringLiteral("Favrin Color Picker"));
+    QGuiApplication::setDesktopFileName(QStringLiteral("com.quenta.favrin.ColorPicker"));
+}
+
+/** Qt found no display to show a window on, and nobody asked for pictures without one. */
+bool hasNoDisplay()
+{
+    return QGuiApplication::platformName() == u"offscreen" && qgetenv("QT_QPA_PLATFORM") != "offscreen";
+}
+
+} // namespace
+
+int main(int argc, char *argv[])
+{
+    // A reader that has left is an error of writing, not the end of this process.
+    std::signal(SIGPIPE, SIG_IGN);
+    const ParsedOptions parsed = parseOptions(texts(argc, argv));
+    if (!parsed.options) {
+        if (parsed.status == ExitStatus::Chosen)
+            return static_cast<int>(printLine(parsed.text.toStdString()) ? ExitStatus::Chosen : ExitStatus::Failed);
+        say(parsed.text);
+        return static_cast<int>(parsed.status);
+    }
+    prepareEnvironment(parsed.options->parent);
+    int onlyTheName = 1;
+    QGuiApplication application(onlyTheName, argv);
+    if (hasNoDisplay()) {
+        say(QStringLiteral("there is no display to show the picker on"));
+        return static_cast<int>(ExitStatus::Failed);
+    }
+    FVColorPickerViewController::startServiceAhead();
+
+    PickerTool tool(*parsed.options, printLine, [&parsed](QWindow &window) {
+        const QString problem = attach(window, parsed.options->parent);
+        if (!problem.isEmpty())
+            say(problem);
+    });
+    QObject::connect(&tool, &PickerTool::ended, &application, [](ExitStatus status, const QString &reason) {
+        if (!reason.isEmpty())
+            say(reason);
+        QCoreApplication::exit(static_cast<int>(status));
+    });
+    tool.start();
+    return QGuiApplication::exec();
+}
