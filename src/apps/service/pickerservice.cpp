@@ -1,5 +1,7 @@
 #include "apps/service/pickerservice.h"
 
+#include "eyedropper/busconnection.h"
+#include "eyedropper/client/dbuseyedropperclient.h"
 #include "platform/color/displaygamut.h"
 #include "platform/strings/translationtable.h"
 #include "remote/limits.h"
@@ -107,6 +109,9 @@ void PickerService::applySurroundings(const remote::Traits &traits)
 void PickerService::build()
 {
     m_front = std::make_unique<service::FVColorPickerServiceFront>([this] { return &m_connection; });
+    // It connects with the first use. Where there can be no bus, nobody could ever dismiss an eyedropper.
+    if (eyedropper::BusConnection::sessionBusMayExist())
+        m_front->eyedropper().setClient(std::make_unique<eyedropper::DBusEyedropperClient>(m_front->eyedropper()));
     m_window = std::make_unique<QQuickWindow>();
     m_window->setFlag(Qt::FramelessWindowHint);
     m_window->setColor(Qt::transparent);
