@@ -119,10 +119,12 @@ FavoriteColorPickerBridge {
         }
     }
 
-    DeleteMenu {
+    CalloutMenu {
         id: menu
 
-        onDeleteRequested: strip.performDelete()
+        command: FavoritesStrings.deleteCommand
+        isDestructive: true
+        onTriggered: strip.performDelete()
         onClosed: strip.forceActiveFocus(Qt.PopupFocusReason)
     }
 }

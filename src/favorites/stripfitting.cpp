@@ -15,6 +15,7 @@ void StripFitting::setUseLandscapeLayout(bool landscape)
     if (landscape == m_useLandscapeLayout)
         return;
     m_useLandscapeLayout = landscape;
+    Q_EMIT layoutChanged();
     Q_EMIT changed();
 }
 

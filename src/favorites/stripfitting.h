@@ -13,10 +13,10 @@ class StripFitting : public QObject
     Q_OBJECT
     QML_ELEMENT
     Q_PROPERTY(double availableWidth READ availableWidth WRITE setAvailableWidth NOTIFY changed FINAL)
-    Q_PROPERTY(bool useLandscapeLayout READ useLandscapeLayout WRITE setUseLandscapeLayout NOTIFY changed FINAL)
+    Q_PROPERTY(bool useLandscapeLayout READ useLandscapeLayout WRITE setUseLandscapeLayout NOTIFY layoutChanged FINAL)
     Q_PROPERTY(int swatchesPerPage READ swatchesPerPage NOTIFY changed FINAL)
     Q_PROPERTY(double inset READ inset NOTIFY changed FINAL)
-    Q_PROPERTY(double stripHeight READ stripHeight NOTIFY changed FINAL)
+    Q_PROPERTY(double stripHeight READ stripHeight NOTIFY layoutChanged FINAL)
 
 public:
     using QObject::QObject;
@@ -33,6 +33,8 @@ public:
 
 Q_SIGNALS:
     void changed();
+    /** The layout is another one; what depends on the width alone is not. */
+    void layoutChanged();
 
 private:
     StripFit fit() const { return stripFit(m_availableWidth, swatchMetrics(m_useLandscapeLayout)); }

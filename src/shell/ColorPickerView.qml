@@ -1,5 +1,6 @@
 import QtQuick
 import Favrin.Service
+import Favrin.Shell
 import Favrin.Theme
 
 /* The root view: everything scrolls together when it is higher than the window. */
@@ -10,14 +11,17 @@ Flickable {
 
     readonly property real horizontalPadding: colorPickerState.useLandscapeLayout ? 20 : 16
     readonly property real innerWidth: Math.max(contentWidth - 2 * horizontalPadding, 0)
-    readonly property real bottomPadding: colorPickerState.useLandscapeLayout ? 20 : 16
     readonly property real spacing: colorPickerState.useLandscapeLayout ? 16 : 20
     readonly property bool fits: contentHeight <= height
+    function revealFocus() {
+        if (!moving)
+            contentY = reveal.position(contentY, height, contentHeight);
+    }
 
     implicitWidth: contentWidth
     implicitHeight: contentHeight
     contentWidth: colorPickerState.size.width
-    contentHeight: content.y + content.height + bottomPadding
+    contentHeight: content.y + content.height
     flickableDirection: Flickable.VerticalFlick
     boundsBehavior: fits ? Flickable.StopAtBounds : Flickable.DragAndOvershootBounds
     interactive: !fits
@@ -28,7 +32,15 @@ Flickable {
     Accessible.role: Accessible.Pane
     Accessible.name: colorPickerState.title
 
+    onHeightChanged: revealFocus()
+    Window.onActiveFocusItemChanged: revealFocus()
     Keys.onEscapePressed: colorPickerState.performClose()
+
+    FocusReveal {
+        id: reveal
+
+        content: root.contentItem
+    }
 
     // Bindings, not a positioner: the height must be known before anything is shown.
     ColorPickerNavigationBar {

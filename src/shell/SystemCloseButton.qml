@@ -1,6 +1,5 @@
 import QtQuick
 import QtQuick.Templates as T
-import Favrin.Shell
 import Favrin.Theme
 
 /* The round close button. Its touch area is larger than its face. */
@@ -10,7 +9,7 @@ T.AbstractButton {
     /* What the button is called. */
     required property string label
 
-    readonly property real diameter: 30
+    readonly property real diameter: Math.round(Theme.barSymbolSize * 30 / 17)
     readonly property real touchArea: 44
 
     implicitWidth: diameter
@@ -30,16 +29,28 @@ T.AbstractButton {
     Keys.onReturnPressed: button.clicked()
     Keys.onEnterPressed: button.clicked()
 
-    background: CloseGlyph {
-        discColor: Theme.fill
-        crossColor: Theme.secondaryLabel
+    background: Item {
         opacity: button.pressed ? 0.5 : 1
 
-        Rectangle {
+        Symbol {
             anchors.fill: parent
-            radius: width / 2
+            kind: Symbol.Disc
+            color: Theme.fill
+        }
+
+        Symbol {
+            anchors.fill: parent
+            kind: Symbol.Disc
             color: Theme.fill
             visible: button.hovered && !button.pressed
+        }
+
+        Symbol {
+            anchors.centerIn: parent
+            width: Math.round(button.diameter * 0.4)
+            height: width
+            kind: Symbol.Cross
+            color: Theme.secondaryLabel
         }
     }
 

@@ -14,10 +14,18 @@ class ShellStrings : public QObject
     QML_SINGLETON
     Q_PROPERTY(QString close READ close CONSTANT FINAL)
     Q_PROPERTY(QString colorPickerType READ colorPickerType CONSTANT FINAL)
+    Q_PROPERTY(QString copy READ copy CONSTANT FINAL)
+    Q_PROPERTY(QString eyedropper READ eyedropper CONSTANT FINAL)
+    Q_PROPERTY(QString eyedropperAlternatives READ eyedropperAlternatives CONSTANT FINAL)
 
 public:
-    QString close() const;
-    QString colorPickerType() const;
+    static QString close();
+    static QString colorPickerType();
+    static QString copy();
+    static QString eyedropper();
+    /** The other words by which somebody who speaks to the computer may mean the eyedropper. */
+    static QString eyedropperAlternatives();
+    static QString selectedColor();
 };
 
 } // namespace favrin::shell

@@ -7,13 +7,6 @@ namespace favrin::shell {
 using service::ColorPickerState;
 using service::Tab;
 
-namespace {
-
-/** The tabs that have a view. */
-constexpr std::array offeredTabs = {Tab::grid, Tab::spectrum};
-
-} // namespace
-
 void TabSegments::setColorPickerState(ColorPickerState *state)
 {
     if (state == m_state)
@@ -30,7 +23,7 @@ void TabSegments::setColorPickerState(ColorPickerState *state)
 QStringList TabSegments::titles() const
 {
     QStringList titles;
-    for (const Tab tab : offeredTabs)
+    for (const Tab tab : service::allTabs)
         titles.append(QString::fromStdString(service::localizedTitle(tab)));
     return titles;
 }
@@ -39,15 +32,15 @@ int TabSegments::current() const
 {
     if (!m_state)
         return 0;
-    const auto found = std::ranges::find(offeredTabs, m_state->selectedTab());
-    return found == offeredTabs.end() ? 0 : static_cast<int>(found - offeredTabs.begin());
+    const auto found = std::ranges::find(service::allTabs, m_state->selectedTab());
+    return found == service::allTabs.end() ? 0 : static_cast<int>(found - service::allTabs.begin());
 }
 
 void TabSegments::setCurrent(int position)
 {
-    if (!m_state || position < 0 || position >= static_cast<int>(offeredTabs.size()))
+    if (!m_state || position < 0 || position >= static_cast<int>(service::allTabs.size()))
         return;
-    const Tab tab = offeredTabs[static_cast<std::size_t>(position)];
+    const Tab tab = service::allTabs[static_cast<std::size_t>(position)];
     if (tab != m_state->selectedTab())
         m_state->selectedTab.set(tab);
 }

@@ -54,9 +54,10 @@ T.AbstractButton {
             Accessible.ignored: true
         }
 
-        MenuIndicator {
+        Symbol {
             id: indicator
 
+            kind: Symbol.UpDownChevrons
             anchors.right: parent.right
             anchors.verticalCenter: parent.verticalCenter
             width: Theme.bodyFont.pixelSize * 0.5

@@ -1,6 +1,5 @@
 import QtQuick
 import QtQuick.Templates as T
-import Favrin.Sliders
 import Favrin.Theme
 
 /* One choice of the color space menu. */
@@ -32,9 +31,10 @@ T.MenuItem {
             color: Theme.label
         }
 
-        CheckMark {
+        Symbol {
             id: mark
 
+            kind: Symbol.CheckMark
             anchors.right: parent.right
             anchors.rightMargin: item.sidePadding
             anchors.verticalCenter: parent.verticalCenter

@@ -1,89 +1,9 @@
-#include "grid/colorswatchpickerview.h"
-#include "shell/colorpickerviewfactory.h"
-#include "spectrum/spectrum.h"
-#include "theme/theme.h"
+#include "pickerwindow.h"
 
-#include <QAccessible>
-#include <QQmlEngine>
-#include <QQuickWindow>
-#include <QTest>
+#include <algorithm>
 
 using namespace favrin;
 using service::Tab;
-
-namespace {
-
-/** The root view in a window of 360 × 480 points. */
-class PickerWindow
-{
-public:
-    PickerWindow()
-    {
-        state.size.set(QSizeF(360.0, 480.0));
-        state.close.set([this] { ++closed; });
-        view = factory.create(state);
-        if (!view)
-            return;
-        view->setParentItem(window.contentItem());
-        view->setSize({360.0, 480.0});
-        view->setFocus(true);
-        window.resize(360, 480);
-        window.show();
-        window.requestActivate();
-    }
-
-    bool isReady() { return view && QTest::qWaitForWindowActive(&window); }
-
-    grid::ColorSwatchPickerView *grid() const { return view->findChild<grid::ColorSwatchPickerView *>(); }
-    /** Null while another tab is shown. */
-    spectrum::Spectrum *spectrum() const { return itemBelow<spectrum::Spectrum>(view.get()); }
-
-    /** Whatever is made later is a child in the scene only. */
-    template<class Item>
-    static Item *itemBelow(QQuickItem *root)
-    {
-        const QList<QQuickItem *> children = root->childItems();
-        for (QQuickItem *child : children) {
-            auto *item = qobject_cast<Item *>(child);
-            if (item || (item = itemBelow<Item>(child)))
-                return item;
-        }
-        return nullptr;
-    }
-
-    /** The first item below the root that assistive technologies call @p name. */
-    QAccessibleInterface *accessible(const QString &name) const { return accessibleBelow(view.get(), name); }
-
-    static QAccessibleInterface *accessibleBelow(const QQuickItem *root, const QString &name)
-    {
-        const QList<QQuickItem *> children = root->childItems();
-        for (QQuickItem *child : children) {
-            QAccessibleInterface *interface = QAccessible::queryAccessibleInterface(child);
-            if (interface && interface->text(QAccessible::Name) == name)
-                return interface;
-            if ((interface = accessibleBelow(child, name)))
-                return interface;
-        }
-        return nullptr;
-    }
-
-    QQuickItem *item(const QString &name) const
-    {
-        QAccessibleInterface *interface = accessible(name);
-        return interface ? qobject_cast<QQuickItem *>(interface->object()) : nullptr;
-    }
-
-    static QRectF inWindow(const QQuickItem *item) { return item->mapRectToScene(item->boundingRect()); }
-
-    service::ColorPickerState state = service::ColorPickerState({});
-    int closed = 0;
-    QQmlEngine engine;
-    shell::ColorPickerViewFactory factory = shell::ColorPickerViewFactory(engine);
-    QQuickWindow window;
-    std::unique_ptr<QQuickItem> view;
-};
-
-} // namespace
 
 class ColorPickerViewTest : public QObject
 {
@@ -91,8 +11,6 @@ class ColorPickerViewTest : public QObject
 
 private Q_SLOTS:
     void cleanup() { theme::Theme::instance().setLayoutDirection(Qt::LeftToRight); }
-    void contentIsLaidOut_data();
-    void contentIsLaidOut();
     void everyWayOfClosingCloses_data();
     void everyWayOfClosingCloses();
     void hiddenCloseButtonKeepsItsRoom_data();
@@ -100,7 +18,8 @@ private Q_SLOTS:
     void longTitleStaysBetweenTheButtons();
     void titleIsPlainText();
     void mirroredExceptTheGrid();
-    void tabStopsAreCloseButtonTabPickerAndContent();
+    void tabStopsFollowTheOrderOfReading_data();
+    void tabStopsFollowTheOrderOfReading();
     void everyWayOfSelectingATabSelectsIt_data();
     void everyWayOfSelectingATabSelectsIt();
     void tabOfTheStateIsShown();
@@ -108,31 +27,6 @@ private Q_SLOTS:
     void arrowsFollowTheDirection();
     void selectingAnotherTabEndsADrag();
 };
-
-void ColorPickerViewTest::contentIsLaidOut_data()
-{
-    QTest::addColumn<bool>("landscape");
-    QTest::addColumn<QRectF>("gridArea");
-    QTest::addColumn<double>("bottomPadding");
-    QTest::newRow("portrait") << false << QRectF(16.0, 107.0, 328.0, 328.0 / 1.2) << 16.0;
-    QTest::newRow("landscape") << true << QRectF(20.0, 103.0, 320.0, 320.0 / 1.2) << 20.0;
-}
-
-void ColorPickerViewTest::contentIsLaidOut()
-{
-    QFETCH(bool, landscape);
-    QFETCH(QRectF, gridArea);
-    QFETCH(double, bottomPadding);
-    PickerWindow picker;
-    picker.state.useLandscapeLayout.set(landscape);
-    // Known at once: the host makes room for the picker before its first frame.
-    QVERIFY(picker.view);
-    QCOMPARE(PickerWindow::inWindow(picker.grid()), gridArea);
-    QCOMPARE(picker.view->implicitWidth(), 360.0);
-    QCOMPARE(picker.view->implicitHeight(), gridArea.bottom() + bottomPadding);
-    QVERIFY(picker.isReady());
-    QCOMPARE(PickerWindow::inWindow(picker.grid()), gridArea);
-}
 
 void ColorPickerViewTest::everyWayOfClosingCloses_data()
 {
@@ -236,24 +130,51 @@ void ColorPickerViewTest::mirroredExceptTheGrid()
     QCOMPARE(picker.grid()->markedCell(), std::optional(grid::CellPosition{1, 0}));
 }
 
-void ColorPickerViewTest::tabStopsAreCloseButtonTabPickerAndContent()
+void ColorPickerViewTest::tabStopsFollowTheOrderOfReading_data()
 {
+    QTest::addColumn<Tab>("tab");
+    QTest::addColumn<QStringList>("content");
+    const auto hex = QStringLiteral("sRGB Hex Color #");
+    QTest::newRow("grid") << Tab::grid << QStringList{QStringLiteral("Grid")};
+    QTest::newRow("spectrum") << Tab::spectrum << QStringList{QStringLiteral("Color Spectrum")};
+    QTest::newRow("sliders") << Tab::sliders
+                             << QStringList{QStringLiteral("Red"),
+                                            QStringLiteral("Red"),
+                                            QStringLiteral("Green"),
+                                            QStringLiteral("Green"),
+                                            QStringLiteral("Blue"),
+                                            QStringLiteral("Blue"),
+                                            hex,
+                                            hex};
+}
+
+void ColorPickerViewTest::tabStopsFollowTheOrderOfReading()
+{
+    QFETCH(Tab, tab);
+    QFETCH(QStringList, content);
     PickerWindow picker;
+    picker.state.selectedTab.set(tab);
+    picker.state.selectedColor.set(model::SomeColor(1.0, 0.0, 0.0, 1.0, model::SomeColor::ColorSpace::sRGB));
     QVERIFY(picker.isReady());
-    QQuickItem *button = picker.item(QStringLiteral("Close"));
-    QTest::keyClick(&picker.window, Qt::Key_Tab);
-    QVERIFY(button->hasActiveFocus());
-    QTest::keyClick(&picker.window, Qt::Key_Tab);
-    QVERIFY(picker.item(QStringLiteral("Color Picker Type"))->hasActiveFocus());
-    QTest::keyClick(&picker.window, Qt::Key_Tab);
-    QVERIFY(picker.grid()->hasActiveFocus());
-    QTest::keyClick(&picker.window, Qt::Key_Tab);
-    QVERIFY(button->hasActiveFocus());
-    picker.state.selectedTab.set(Tab::spectrum);
-    QTest::keyClick(&picker.window, Qt::Key_Tab);
-    QTest::keyClick(&picker.window, Qt::Key_Tab);
-    QVERIFY(picker.spectrum()->hasActiveFocus());
-    QVERIFY(picker.spectrum()->focusVisible());
+    const QStringList expected = QStringList{QStringLiteral("Eyedropper_Accessibility"), QStringLiteral("Close"),
+                                             QStringLiteral("Color Picker Type")} +
+                                 content +
+                                 QStringList{QStringLiteral("Opacity"), QStringLiteral("Opacity"),
+                                             QStringLiteral("Selected Color"), QStringLiteral("Favorites")};
+    const auto names = [&](Qt::Key key, Qt::KeyboardModifiers modifiers) {
+        QStringList stops;
+        for (qsizetype stop = 0; stop < expected.size(); ++stop) {
+            QTest::keyClick(&picker.window, key, modifiers);
+            QAccessibleInterface *stopped = QAccessible::queryAccessibleInterface(picker.window.activeFocusItem());
+            stops.append(stopped ? stopped->text(QAccessible::Name) : QStringLiteral("nothing"));
+        }
+        return stops;
+    };
+    QCOMPARE(names(Qt::Key_Tab, {}), expected);
+    QStringList backward = names(Qt::Key_Backtab, Qt::ShiftModifier);
+    std::ranges::reverse(backward);
+    backward.append(backward.takeFirst());
+    QCOMPARE(backward, expected);
 }
 
 void ColorPickerViewTest::everyWayOfSelectingATabSelectsIt_data()
@@ -320,8 +241,9 @@ void ColorPickerViewTest::arrowsFollowTheDirection()
     theme::Theme::instance().setLayoutDirection(mirrored ? Qt::RightToLeft : Qt::LeftToRight);
     PickerWindow picker;
     QVERIFY(picker.isReady());
+    const QRectF first = PickerWindow::inWindow(picker.item(QStringLiteral("Grid")));
     const QRectF second = PickerWindow::inWindow(picker.item(QStringLiteral("Spectrum")));
-    QCOMPARE(second.left() < 180.0, mirrored);
+    QCOMPARE(second.left() < first.left(), mirrored);
     picker.item(QStringLiteral("Color Picker Type"))->forceActiveFocus();
     const Qt::Key forward = mirrored ? Qt::Key_Left : Qt::Key_Right;
     const Qt::Key back = mirrored ? Qt::Key_Right : Qt::Key_Left;

@@ -4,7 +4,7 @@
 
 #include <QtQmlIntegration/qqmlintegration.h>
 
-namespace favrin::favorites {
+namespace favrin::theme {
 
 /** The face of a menu that points at something below it: a rounded box with an arrow at its lower edge, and a shadow.
  */
@@ -34,4 +34,4 @@ private:
     double m_arrowX = 0.0;
 };
 
-} // namespace favrin::favorites
+} // namespace favrin::theme

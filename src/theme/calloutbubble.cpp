@@ -1,4 +1,4 @@
-#include "favorites/calloutbubble.h"
+#include "theme/calloutbubble.h"
 
 #include "platform/shapes/continuousroundedrect.h"
 #include "platform/shapes/dropshadow.h"
@@ -10,7 +10,7 @@
 
 #include <algorithm>
 
-namespace favrin::favorites {
+namespace favrin::theme {
 namespace {
 
 constexpr double cornerRadius = 10.0;
@@ -40,7 +40,7 @@ QPainterPath outline(QSizeF size, double arrowX, double point)
 CalloutBubble::CalloutBubble(QQuickItem *parent) : CrispPaintedItem(parent)
 {
     setOverhang(1.5 * shadowBlurRadius);
-    connect(&theme::Theme::instance(), &theme::Theme::colorsChanged, this, [this] { repaint(); });
+    connect(&Theme::instance(), &Theme::colorsChanged, this, [this] { repaint(); });
 }
 
 double CalloutBubble::arrowHeight() const
@@ -59,7 +59,7 @@ void CalloutBubble::setArrowX(double x)
 
 void CalloutBubble::paint(QPainter &painter, QSize size, double devicePixelRatio)
 {
-    const theme::Theme &theme = theme::Theme::instance();
+    const Theme &theme = Theme::instance();
     const QPainterPath path = outline(size, m_arrowX, devicePixelRatio);
     const int margin = overhangPixels(devicePixelRatio);
     QImage face(size.grownBy({margin, margin, margin, margin}), QImage::Format_ARGB32_Premultiplied);
@@ -77,4 +77,4 @@ void CalloutBubble::paint(QPainter &painter, QSize size, double devicePixelRatio
     painter.drawImage(-margin, -margin, face);
 }
 
-} // namespace favrin::favorites
+} // namespace favrin::theme

@@ -1,22 +1,26 @@
 import QtQuick
 import QtQuick.Templates as T
-import Favrin.Favorites
 import Favrin.Theme
 
-/* The delete command, above the cell it is for. It lies in the scene: a window of its own would be dismissed at once. */
+/* One command, above what it is for. It lies in the scene: a window of its own would be dismissed at once. */
 T.Menu {
     id: menu
 
-    signal deleteRequested
+    /* What the command is called. */
+    required property string command
+    /* Whether something is lost by it. */
+    property bool isDestructive: false
+
+    signal triggered
 
     readonly property real rowHeight: Math.max(40, Theme.bodyFont.pixelSize * 2)
     readonly property real gap: 6
-    /* The middle of the cell, in the parent's coordinates. */
+    /* The middle of what the command is for, in the parent's coordinates. */
     property real targetX: 0
     readonly property CalloutBubble bubble: CalloutBubble { arrowX: menu.targetX - menu.x }
 
-    function openAt(item: Item, cell: rect) {
-        parent = item;
+    function openAt(target: Item, cell: rect) {
+        parent = target;
         targetX = cell.x + cell.width / 2;
         x = targetX - width / 2;
         y = cell.y - gap - height;
@@ -27,7 +31,7 @@ T.Menu {
     modal: true
     dim: false
     focus: true
-    implicitWidth: Math.max(96, command.implicitWidth)
+    implicitWidth: Math.max(96, item.implicitWidth)
     implicitHeight: rowHeight + bubble.arrowHeight
     bottomPadding: bubble.arrowHeight
     onOpened: currentIndex = 0
@@ -41,26 +45,26 @@ T.Menu {
     background: bubble
 
     T.MenuItem {
-        id: command
+        id: item
 
-        text: FavoritesStrings.deleteCommand
+        text: menu.command
         implicitWidth: label.implicitWidth + 40
         implicitHeight: menu.rowHeight
         hoverEnabled: true
-        onTriggered: menu.deleteRequested()
+        onTriggered: menu.triggered()
 
         Accessible.role: Accessible.MenuItem
         Accessible.name: text
-        Accessible.onPressAction: command.triggered()
+        Accessible.onPressAction: item.triggered()
 
         Text {
             id: label
 
             anchors.centerIn: parent
-            text: command.text
+            text: item.text
             textFormat: Text.PlainText
             font: Theme.bodyFont
-            color: Theme.systemRed
+            color: menu.isDestructive ? Theme.systemRed : Theme.label
         }
 
         background: Item {
@@ -69,7 +73,7 @@ T.Menu {
                 anchors.margins: 3
                 radius: 7
                 color: Theme.fill
-                visible: command.highlighted || command.hovered || command.down
+                visible: item.highlighted || item.hovered || item.down
             }
         }
     }
