@@ -12,8 +12,8 @@
 namespace favrin::tool {
 
 /**
- * One question to the user: a window with the picker in it, and the answer. The window is made by start() and shown when
- * the picker has drawn. GUI thread.
+ * One question to the user: a window with the picker in it, and the answer. The window is made by start() and shown
+ * when the picker has drawn. GUI thread.
  */
 class PickerTool : public QObject
 {
