@@ -43,6 +43,14 @@ Presentation::~Presentation()
         m_focusBefore->forceActiveFocus(Qt::PopupFocusReason);
 }
 
+QSizeF Presentation::surroundingSize() const
+{
+    if (m_style == PresentationStyle::Embedded)
+        return m_place ? m_place->size() : QSizeF(0, 0);
+    const QQuickWindow *shownIn = window();
+    return shownIn ? QSizeF(shownIn->size()) : QSizeF(0, 0);
+}
+
 QQuickWindow *Presentation::window() const
 {
     return m_parentItem ? m_parentItem->window() : nullptr;

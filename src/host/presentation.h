@@ -33,6 +33,8 @@ public:
     PresentationStyle style() const { return m_style; }
     QQuickWindow *window() const;
     RemoteViewItem *view() const { return m_view.data(); }
+    /** What the picker adapts its layout to: the container that it is embedded in, otherwise the window. */
+    QSizeF surroundingSize() const;
 
     void setPreferredContentSize(QSizeF size);
     void setAppearance(bool dark);
