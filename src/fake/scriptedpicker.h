@@ -26,6 +26,8 @@ public:
     void present(host::PresentationStyle style, QQuickItem &place) override;
     void dismiss() override;
     QQuickItem *view() const override { return m_view; }
+    /** Scripts play one. */
+    bool isEyedropperAvailable() override { return true; }
 
 private:
     void wishesDidChange() override {}

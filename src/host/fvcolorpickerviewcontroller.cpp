@@ -26,6 +26,8 @@ FVColorPickerViewController::Private::Private(FVColorPickerViewController &contr
                      &FVColorPickerViewController::pickerDidFloatEyedropper);
     QObject::connect(picker.get(), &Picker::eyedropperDismissed, self,
                      &FVColorPickerViewController::pickerDidDismissEyedropper);
+    QObject::connect(picker.get(), &Picker::eyedropperAvailableChanged, self,
+                     &FVColorPickerViewController::eyedropperAvailableChanged);
     QObject::connect(picker.get(), &Picker::finished, self, &FVColorPickerViewController::colorPickerDidFinish);
     QObject::connect(picker.get(), &Picker::terminated, self,
                      &FVColorPickerViewController::colorPickerViewServiceDidTerminateWithError);
@@ -76,6 +78,11 @@ QSizeF FVColorPickerViewController::preferredContentSize() const
 bool FVColorPickerViewController::wantsMaterial() const
 {
     return d->wantsMaterial;
+}
+
+bool FVColorPickerViewController::isEyedropperAvailable() const
+{
+    return d->picker->isEyedropperAvailable();
 }
 
 FVColorPickerViewController::State FVColorPickerViewController::state() const

@@ -33,6 +33,7 @@ class FAVRIN_HOST_EXPORT FVColorPickerViewController : public QObject
     Q_PROPERTY(bool showsAlpha READ showsAlpha WRITE setShowsAlpha NOTIFY showsAlphaChanged)
     Q_PROPERTY(bool allowsNoColor READ allowsNoColor WRITE setAllowsNoColor NOTIFY allowsNoColorChanged)
     Q_PROPERTY(bool showsEyedropper READ showsEyedropper WRITE setShowsEyedropper NOTIFY showsEyedropperChanged)
+    Q_PROPERTY(bool eyedropperAvailable READ isEyedropperAvailable NOTIFY eyedropperAvailableChanged)
     Q_PROPERTY(QList<FVColor> suggestedColors READ suggestedColors WRITE setSuggestedColors RESET resetSuggestedColors
                    NOTIFY suggestedColorsChanged)
     Q_PROPERTY(bool usesDarkGridInDarkMode READ usesDarkGridInDarkMode WRITE setUsesDarkGridInDarkMode NOTIFY
@@ -121,6 +122,12 @@ public:
     /** The eyedropper button is offered; true at first. */
     bool showsEyedropper() const;
     void setShowsEyedropper(bool shows);
+    /**
+     * Whether an eyedropper can work here: an eyedropper service is there and has a screen to sample. False until that
+     * is known, which takes some milliseconds after the first call; no call waits. An app that must not offer what
+     * cannot work binds showsEyedropper to it.
+     */
+    bool isEyedropperAvailable() const;
     /** Colors the app proposes; at most 2,048 are shown and the rest is left out, which the log says. */
     QList<FVColor> suggestedColors() const;
     void setSuggestedColors(const QList<FVColor> &colors);
@@ -153,7 +160,10 @@ public:
     bool increaseContrast() const;
     void setIncreaseContrast(bool increase);
 
-    /** Size of the window the picker adapts to; that of the window that shows it until it is set. */
+    /**
+     * Size in points of what the picker adapts its layout to: of the window that shows it, or of the container that it
+     * is embedded in, until it is set.
+     */
     QSizeF hostWindowSize() const;
     void setHostWindowSize(QSizeF size);
     void resetHostWindowSize();
@@ -215,6 +225,7 @@ Q_SIGNALS:
     void showsAlphaChanged();
     void allowsNoColorChanged();
     void showsEyedropperChanged();
+    void eyedropperAvailableChanged();
     void suggestedColorsChanged();
     void usesDarkGridInDarkModeChanged();
     void gridAppearanceChanged();

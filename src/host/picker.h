@@ -62,6 +62,8 @@ public:
     virtual void present(PresentationStyle style, QQuickItem &place) = 0;
     virtual void dismiss() = 0;
     virtual QQuickItem *view() const = 0;
+    /** Whether an eyedropper can work here, as far as it is known; the first call starts to find out. */
+    virtual bool isEyedropperAvailable() = 0;
 
 Q_SIGNALS:
     void stateChanged();
@@ -70,6 +72,7 @@ Q_SIGNALS:
     void eyedropperShown();
     void eyedropperFloated();
     void eyedropperDismissed();
+    void eyedropperAvailableChanged();
     void finished();
     void terminated(const QString &error);
     void preferredContentSizeChanged(QSizeF size);

@@ -1,5 +1,7 @@
 #include "host/remotepicker.h"
 
+#include "eyedropper/displayidentifier.h"
+#include "eyedropper/eyedropperavailability.h"
 #include "host/presentation.h"
 #include "host/remoteviewitem.h"
 #include "host/remoteviewsession.h"
@@ -9,6 +11,7 @@
 #include <QGuiApplication>
 #include <QInputMethod>
 #include <QPalette>
+#include <QPointer>
 #include <QQuickWindow>
 #include <QScreen>
 
@@ -39,10 +42,18 @@ remote::PresentationContext contextOf(PresentationStyle style)
 std::string displayIdentifier(const QQuickWindow *window)
 {
     const QScreen *screen = window ? window->screen() : QGuiApplication::primaryScreen();
-    if (!screen)
-        return {};
-    const auto serial = screen->serialNumber();
-    return (serial.isEmpty() ? screen->name() : screen->name() + u':' + serial).toStdString();
+    return eyedropper::displayIdentifier(screen).toStdString();
+}
+
+/** The one question of this process, asked when the first picker wants to know. */
+eyedropper::EyedropperAvailability &eyedropperAvailability()
+{
+    static QPointer<eyedropper::EyedropperAvailability> availability;
+    if (!availability) {
+        availability = new eyedropper::EyedropperAvailability({}, QCoreApplication::instance());
+        availability->ask();
+    }
+    return *availability;
 }
 
 } // namespace
@@ -106,8 +117,7 @@ QSizeF RemotePicker::hostWindowSize() const
 {
     if (wishes().hostWindowSize)
         return *wishes().hostWindowSize;
-    const QQuickWindow *window = m_presentation ? m_presentation->window() : nullptr;
-    return window ? QSizeF(window->size()) : QSizeF(0, 0);
+    return m_presentation ? m_presentation->surroundingSize() : QSizeF(0, 0);
 }
 
 double RemotePicker::keyboardSpace() const
@@ -128,6 +138,15 @@ double RemotePicker::keyboardSpace() const
 QQuickItem *RemotePicker::view() const
 {
     return m_presentation ? m_presentation->view() : nullptr;
+}
+
+bool RemotePicker::isEyedropperAvailable()
+{
+    auto &availability = eyedropperAvailability();
+    if (!std::exchange(m_watchesEyedropper, true))
+        connect(&availability, &eyedropper::EyedropperAvailability::changed, this,
+                &RemotePicker::eyedropperAvailableChanged);
+    return availability.isAvailable();
 }
 
 qint64 RemotePicker::serviceProcessIdentifier() const
@@ -202,6 +221,10 @@ void RemotePicker::connectSurroundings()
         scheduleUpdate();
         Q_EMIT surroundingsChanged();
     };
+    if (const auto *view = m_presentation->view()) {
+        connect(view, &QQuickItem::widthChanged, m_presentation.get(), update);
+        connect(view, &QQuickItem::heightChanged, m_presentation.get(), update);
+    }
     if (const auto *window = m_presentation->window()) {
         connect(window, &QQuickWindow::widthChanged, m_presentation.get(), update);
         connect(window, &QQuickWindow::heightChanged, m_presentation.get(), update);

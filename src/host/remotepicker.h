@@ -30,6 +30,7 @@ public:
     void present(PresentationStyle style, QQuickItem &place) override;
     void dismiss() override;
     QQuickItem *view() const override;
+    bool isEyedropperAvailable() override;
     /** For tests and for those who watch the process; 0 while none runs. */
     qint64 serviceProcessIdentifier() const;
 
@@ -59,6 +60,7 @@ private:
     bool m_updateScheduled = false;
     std::optional<remote::Traits> m_sentTraits;
     std::optional<remote::Configuration> m_sentConfiguration;
+    bool m_watchesEyedropper = false;
 };
 
 } // namespace favrin::host

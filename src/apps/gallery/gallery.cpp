@@ -11,6 +11,7 @@ Gallery::Gallery(QObject *parent) : QObject(parent), m_presenter(&m_picker)
     m_picker.setSuggestedColors(m_poster.colors());
     connectPoster();
     connectMessages();
+    offerEyedropper();
     showSelectedPart();
 }
 
@@ -44,6 +45,14 @@ void Gallery::connectPoster()
 {
     connect(&m_poster, &Poster::selectedPartChanged, this, &Gallery::showSelectedPart);
     connect(&m_picker, &Picker::pickerDidSelectColor, this, &Gallery::takePick);
+}
+
+void Gallery::offerEyedropper()
+{
+    // Only where one can work; that may be known only later, and may change.
+    const auto offer = [this] { m_picker.setShowsEyedropper(m_picker.isEyedropperAvailable()); };
+    connect(&m_picker, &Picker::eyedropperAvailableChanged, this, offer);
+    offer();
 }
 
 void Gallery::connectMessages()

@@ -43,6 +43,7 @@ Q_SIGNALS:
 private:
     void connectPoster();
     void connectMessages();
+    void offerEyedropper();
     void showSelectedPart();
     void takePick(const FVColor &color, const QString &colorspace, bool isVolatile);
 
