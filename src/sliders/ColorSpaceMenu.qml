@@ -13,13 +13,19 @@ T.Menu {
 
     readonly property real rowHeight: Math.max(40, Theme.bodyFont.pixelSize * 2)
     readonly property real sidePadding: 14
+    readonly property real widestItem: {
+        let widest = 0;
+        for (let index = 0; index < count; ++index)
+            widest = Math.max(widest, itemAt(index).implicitWidth);
+        return widest;
+    }
 
     title: switcher.menuTitle
     margins: 8
     topPadding: rowHeight
     modal: false
     focus: true
-    implicitWidth: 190
+    implicitWidth: Math.max(190, widestItem, heading.implicitWidth + 2 * sidePadding)
     implicitHeight: rowHeight * (switcher.names.length + 1)
     onOpened: currentIndex = switcher.current
 
@@ -42,6 +48,8 @@ T.Menu {
         }
 
         Text {
+            id: heading
+
             x: menu.sidePadding
             width: parent.width - 2 * menu.sidePadding
             height: menu.rowHeight

@@ -9,6 +9,7 @@ T.MenuItem {
     required property bool isCurrent
     required property real sidePadding
 
+    implicitWidth: label.implicitWidth + mark.width + 3 * sidePadding
     hoverEnabled: true
 
     Accessible.role: Accessible.RadioButton
@@ -20,6 +21,8 @@ T.MenuItem {
     Item {
         anchors.fill: parent
         Text {
+            id: label
+
             anchors.left: parent.left
             anchors.right: mark.left
             anchors.margins: item.sidePadding
