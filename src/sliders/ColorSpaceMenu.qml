@@ -20,12 +20,17 @@ T.Menu {
         return widest;
     }
 
+    readonly property TextMetrics heading: TextMetrics {
+        font: Theme.subheadlineFont
+        text: menu.title
+    }
+
     title: switcher.menuTitle
     margins: 8
     topPadding: rowHeight
     modal: false
     focus: true
-    implicitWidth: Math.max(190, widestItem, heading.implicitWidth + 2 * sidePadding)
+    implicitWidth: Math.max(190, widestItem, Math.ceil(heading.advanceWidth) + 2 * sidePadding)
     implicitHeight: rowHeight * (switcher.names.length + 1)
     onOpened: currentIndex = switcher.current
 
@@ -48,8 +53,6 @@ T.Menu {
         }
 
         Text {
-            id: heading
-
             x: menu.sidePadding
             width: parent.width - 2 * menu.sidePadding
             height: menu.rowHeight
