@@ -34,16 +34,24 @@ void setDefault(const char *variable, const QByteArray &value)
         qputenv(variable, value);
 }
 
+/** The user wants no display: pictures only, as tests do. */
+bool isOffscreenWanted()
+{
+    return qgetenv("QT_QPA_PLATFORM").startsWith("offscreen");
+}
+
 /** The platforms to try, best first. The last one always starts, and tells that the others did not. */
 QByteArray platforms(const ParentHandle &parent)
 {
-    const bool hasWayland = !qEnvironmentVariableIsEmpty("WAYLAND_DISPLAY");
-    const bool hasX11 = !qEnvironmentVariableIsEmpty("DISPLAY");
     QByteArrayList list;
-    if (hasWayland)
-        list.append("wayland");
-    if (hasX11)
-        list.insert(std::holds_alternative<X11Window>(parent) ? 0 : list.size(), "xcb");
+    if (const QByteArray wanted = qgetenv("QT_QPA_PLATFORM"); !wanted.isEmpty()) {
+        list.append(wanted);
+    } else {
+        if (!qEnvironmentVariableIsEmpty("WAYLAND_DISPLAY"))
+            list.append("wayland");
+        if (!qEnvironmentVariableIsEmpty("DISPLAY"))
+            list.insert(std::holds_alternative<X11Window>(parent) ? 0 : list.size(), "xcb");
+    }
     list.append("offscreen");
     return list.join(';');
 }
@@ -51,7 +59,7 @@ QByteArray platforms(const ParentHandle &parent)
 /** What Qt must know before it starts: nothing that the first frame does not need. */
 void prepareEnvironment(const ParentHandle &parent)
 {
-    setDefault("QT_QPA_PLATFORM", platforms(parent));
+    qputenv("QT_QPA_PLATFORM", platforms(parent));
     // Qt otherwise waits 5 ms before each frame, which a drag over the picker would show.
     setDefault("QT_QPA_UPDATE_IDLE_TIME", "0");
     setDefault("QSG_RENDER_LOOP", "basic");
@@ -59,12 +67,6 @@ void prepareEnvironment(const ParentHandle &parent)
     QGuiApplication::setApplicationName(QStringLiteral("favrin-color-picker"));
     QGuiApplication::setApplicationDisplayName(QStringLiteral("Favrin Color Picker"));
     QGuiApplication::setDesktopFileName(QStringLiteral("com.quenta.favrin.ColorPicker"));
-}
-
-/** Qt found no display to show a window on, and nobody asked for pictures without one. */
-bool hasNoDisplay()
-{
-    return QGuiApplication::platformName() == u"offscreen" && qgetenv("QT_QPA_PLATFORM") != "offscreen";
 }
 
 } // namespace
@@ -80,10 +82,11 @@ int main(int argc, char *argv[])
         say(parsed.text);
         return static_cast<int>(parsed.status);
     }
+    const bool isDisplayNeeded = !isOffscreenWanted();
     prepareEnvironment(parsed.options->parent);
     int onlyTheName = 1;
     QGuiApplication application(onlyTheName, argv);
-    if (hasNoDisplay()) {
+    if (isDisplayNeeded && QGuiApplication::platformName() == u"offscreen") {
         say(QStringLiteral("there is no display to show the picker on"));
         return static_cast<int>(ExitStatus::Failed);
     }

@@ -66,6 +66,9 @@ void PickerTool::configurePicker()
         m_picker.setTitle(m_options.title);
     m_picker.setShowsAlpha(m_options.allowsOpacity);
     m_picker.setAllowsNoColor(m_options.allowsNoColor);
+    const auto offerEyedropper = [this] { m_picker.setShowsEyedropper(m_picker.isEyedropperAvailable()); };
+    connect(&m_picker, &FVColorPickerViewController::eyedropperAvailableChanged, this, offerEyedropper);
+    offerEyedropper();
     if (m_options.color) {
         Choice color = *m_options.color;
         if (color && !m_options.allowsOpacity)
