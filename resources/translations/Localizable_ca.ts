@@ -131,7 +131,7 @@
     <message>
         <source>Sliders</source>
         <extracomment>Title of the tab.</extracomment>
-        <translation>Controls lliscants</translation>
+        <translation>Lliscadors</translation>
     </message>
     <message>
         <source>Spectrum</source>

@@ -131,7 +131,7 @@
     <message>
         <source>Sliders</source>
         <extracomment>Title of the tab.</extracomment>
-        <translation>Glidebrytere</translation>
+        <translation>Glidere</translation>
     </message>
     <message>
         <source>Spectrum</source>
