@@ -28,14 +28,19 @@ QRect centered(QSize size, QPoint center)
     return QRect(center - QPoint(size.width() / 2, size.height() / 2), size);
 }
 
-QRect discAbove(QPoint crosshair, const QRect &display, int diameter, const LoupeMetrics &metrics)
+/** Above the finger when there is room, else below it or beside it. */
+QRect discClearOfFinger(QPoint crosshair, const QRect &display, int diameter, const LoupeMetrics &metrics)
 {
-    QRect disc = centered({diameter, diameter}, crosshair);
-    disc.moveBottom(crosshair.y() - metrics.fingerRoom);
+    const QRect over = centered({diameter, diameter}, crosshair);
+    const int room = over.height() / 2 + metrics.fingerRoom;
     // Below, it has to clear the finger's whole tip.
-    if (disc.top() < display.top())
-        disc.moveTop(crosshair.y() + 2 * metrics.fingerRoom);
-    return movedInto(disc, display);
+    for (const QPoint way : {QPoint(0, -room), QPoint(0, room + metrics.fingerRoom)}) {
+        const QRect disc = over.translated(way);
+        if (disc.top() >= display.top() && disc.bottom() <= display.bottom())
+            return movedInto(disc, display);
+    }
+    const bool isLeft = crosshair.x() > display.center().x();
+    return movedInto(over.translated(isLeft ? -room : room, 0), display);
 }
 
 QRect labelBeside(const QRect &disc, QPoint crosshair, const QRect &display, QSize size, const LoupeMetrics &metrics)
@@ -86,7 +91,7 @@ LoupeGeometry loupeGeometry(QPoint crosshair, const QRect &display, QSize label,
     LoupeGeometry geometry;
     const int diameter = metrics.lens + 2 * metrics.ring;
     geometry.disc = placement == LoupePlacement::Around ? centered({diameter, diameter}, crosshair)
-                                                        : discAbove(crosshair, display, diameter, metrics);
+                                                        : discClearOfFinger(crosshair, display, diameter, metrics);
     geometry.lens = geometry.disc.adjusted(metrics.ring, metrics.ring, -metrics.ring, -metrics.ring);
     geometry.label = labelBeside(geometry.disc, crosshair, display, label, metrics);
     const int shadow = metrics.shadow;

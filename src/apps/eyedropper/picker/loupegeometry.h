@@ -55,8 +55,8 @@ struct LoupeGeometry
 
 /**
  * The loupe for the sampled pixel @p crosshair on a display. A loupe around the pixel stays there and may be cut off by
- * the display's edge; one above it moves to the side or below at the edge, so that it is seen whole. The label is
- * always on the display.
+ * the display's edge; one above it gives way at the edge, below the finger or beside it, so that it is seen whole. The
+ * label is always on the display.
  */
 LoupeGeometry loupeGeometry(QPoint crosshair, const QRect &display, QSize label, LoupePlacement placement,
                             const LoupeMetrics &metrics);
