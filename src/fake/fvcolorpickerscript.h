@@ -30,8 +30,11 @@ public:
     /** The picker opens and does nothing. */
     FVColorPickerScript();
     ~FVColorPickerScript();
+    ///@{
+    /** The same steps; scripts may be kept and played again. */
     FVColorPickerScript(const FVColorPickerScript &other);
     FVColorPickerScript &operator=(const FVColorPickerScript &other);
+    ///@}
 
     /** The user picks @p color at once: one final report. Invalid colors are no color, as in pickNoColor(). */
     FVColorPickerScript &pick(const FVColor &color);

@@ -27,9 +27,11 @@ class FAVRIN_HOST_EXPORT FVColor
     Q_PROPERTY(QString colorSpace READ colorSpace)
 
 public:
-    /** Platform names of the spaces that the picker works in. */
+    ///@{
+    /** Platform name of a space that the picker works in. */
     static QString sRGBName();
     static QString displayP3Name();
+    ///@}
 
     /** No color. */
     FVColor() = default;
@@ -49,10 +51,15 @@ public:
     /** As QColor reads it: in sRGB, clipped to 0…1. Invalid for no color. */
     Q_INVOKABLE QColor toQColor() const;
 
+    /** False for no color, whose numbers are all 0. */
     bool isValid() const { return m_valid; }
+    ///@{
+    /** Gamma-encoded component of the color's own space, nominally 0…1. */
     double red() const { return m_red; }
     double green() const { return m_green; }
     double blue() const { return m_blue; }
+    ///@}
+    /** Opacity: 0 transparent, 1 opaque. */
     double alpha() const { return m_alpha; }
     /** Platform name of the space, empty for no color. */
     QString colorSpace() const { return m_colorSpace; }

@@ -58,6 +58,7 @@ class FAVRIN_HOST_EXPORT FVColorPickerViewController : public QObject
     Q_PROPERTY(bool presented READ isPresented NOTIFY stateChanged)
 
 public:
+    /** A light or a dark look; Unspecified leaves the choice to what surrounds. */
     enum class Appearance { Unspecified = 0, Light = 1, Dark = 2 };
     Q_ENUM(Appearance)
 
@@ -82,6 +83,7 @@ public:
     enum class DisplayGamut { SRGB, P3 };
     Q_ENUM(DisplayGamut)
 
+    /** Where a picker stands; each presentation goes from Starting to Ready, and ends in NotRunning or Failed. */
     enum class State {
         /** Nothing is shown and no process runs for this picker. */
         NotRunning,
@@ -96,13 +98,17 @@ public:
     };
     Q_ENUM(State)
 
+    /** A picker that is not presented; nothing is started yet. Needs a QGuiApplication. */
     explicit FVColorPickerViewController(QObject *parent = nullptr);
+    /** Ends a presentation at once; nothing is reported any more. */
     ~FVColorPickerViewController() override;
 
+    ///@{
     /** The headline; a null text (the default) shows the picker's own. At most 1,024 bytes of UTF-8 are shown. */
     QString title() const;
     void setTitle(const QString &title);
     void resetTitle();
+    ///@}
 
     /** What the app set or the user picked last; no color while there is none. Setting it never comes back as a pick.
      */
@@ -113,53 +119,84 @@ public:
      */
     void setSelectedColor(const FVColor &color);
 
+    ///@{
     /** Opacity can be edited; true at first. */
     bool showsAlpha() const;
     void setShowsAlpha(bool shows);
+    ///@}
+    ///@{
     /** The user may choose no color at all; false at first. */
     bool allowsNoColor() const;
     void setAllowsNoColor(bool allows);
+    ///@}
+    ///@{
     /** The eyedropper button is offered; true at first. */
     bool showsEyedropper() const;
     void setShowsEyedropper(bool shows);
+    ///@}
     /**
      * Whether an eyedropper can work here: an eyedropper service is there and has a screen to sample. False until that
      * is known, which takes some milliseconds after the first call; no call waits. An app that must not offer what
      * cannot work binds showsEyedropper to it.
      */
     bool isEyedropperAvailable() const;
+    ///@{
     /** Colors the app proposes; at most 2,048 are shown and the rest is left out, which the log says. */
     QList<FVColor> suggestedColors() const;
     void setSuggestedColors(const QList<FVColor> &colors);
+    ///@}
     /** Takes the proposals away, which is not the same as proposing none. */
     void resetSuggestedColors();
+    ///@{
     /** The grid may switch to its dark palette in the dark appearance; false at first. */
     bool usesDarkGridInDarkMode() const;
     void setUsesDarkGridInDarkMode(bool uses);
+    ///@}
+    ///@{
     /** Forces the grid's appearance; Unspecified follows the picker. */
     Appearance gridAppearance() const;
     void setGridAppearance(Appearance appearance);
+    ///@}
 
+    ///@{
     /** Appearance of the picker; Unspecified (at first) follows the palette of the window that shows it. */
     Appearance appearance() const;
     void setAppearance(Appearance appearance);
+    ///@}
+    ///@{
     /** Reading direction; that of the application until it is set. */
     Qt::LayoutDirection layoutDirection() const;
     void setLayoutDirection(Qt::LayoutDirection direction);
     void resetLayoutDirection();
+    ///@}
+    ///@{
+    /** Size of the picker's text; Large at first. */
     TextSizeCategory textSizeCategory() const;
     void setTextSizeCategory(TextSizeCategory category);
+    ///@}
+    ///@{
     /** Language and number formats; QLocale() until it is set. */
     QLocale locale() const;
     void setLocale(const QLocale &locale);
     void resetLocale();
+    ///@}
+    ///@{
+    /** What the window that shows the picker is shown in; SRGB at first. */
     DisplayGamut displayGamut() const;
     void setDisplayGamut(DisplayGamut gamut);
+    ///@}
+    ///@{
+    /** The user wants no animations; false at first. */
     bool reduceMotion() const;
     void setReduceMotion(bool reduce);
+    ///@}
+    ///@{
+    /** The user wants clearer borders and texts; false at first. */
     bool increaseContrast() const;
     void setIncreaseContrast(bool increase);
+    ///@}
 
+    ///@{
     /**
      * Size in points of what the picker adapts its layout to: of the window that shows it, or of the container that it
      * is embedded in, until it is set.
@@ -167,10 +204,13 @@ public:
     QSizeF hostWindowSize() const;
     void setHostWindowSize(QSizeF size);
     void resetHostWindowSize();
+    ///@}
+    ///@{
     /** Height that the on-screen keyboard covers at the bottom of the picker; followed by itself until it is set. */
     double keyboardSpace() const;
     void setKeyboardSpace(double space);
     void resetKeyboardSpace();
+    ///@}
 
     /** How large the picker would like to be; 0 × 0 until it has said so. */
     QSizeF preferredContentSize() const;
@@ -178,7 +218,9 @@ public:
      */
     bool wantsMaterial() const;
 
+    /** Where the picker stands. */
     State state() const;
+    /** The picker is on screen, or will be as soon as its process has drawn. */
     bool isPresented() const { return state() == State::Starting || state() == State::Ready; }
 
     /** Shows the picker over the content of the window. Does nothing while it is presented already. */
@@ -212,14 +254,19 @@ Q_SIGNALS:
      * true while a gesture goes on; the last color of a gesture comes again with false.
      */
     void pickerDidSelectColor(const FVColor &color, const QString &colorspace, bool isVolatile);
+    /** The user took up the eyedropper, which waits to be moved. */
     void pickerDidShowEyedropper();
+    /** The eyedropper moves over the screen. */
     void pickerDidFloatEyedropper();
+    /** The eyedropper is gone, with or without a color. */
     void pickerDidDismissEyedropper();
     /** The presentation has ended, by the user or by dismiss(). */
     void colorPickerDidFinish();
     /** The picker's process ended by itself or broke a rule; the picker is no longer shown. */
     void colorPickerViewServiceDidTerminateWithError(const QString &error);
 
+    ///@{
+    /** The property of this name has a new value. */
     void titleChanged();
     void selectedColorChanged();
     void showsAlphaChanged();
@@ -241,6 +288,7 @@ Q_SIGNALS:
     void preferredContentSizeChanged();
     void wantsMaterialChanged();
     void stateChanged();
+    ///@}
 
 private:
     class Q_DECL_HIDDEN Private;
