@@ -93,7 +93,7 @@ void PortalPicking::listenAt(const QString &requestPath)
 {
     m_requestPath = requestPath;
     m_bus.connect(m_portal.owner(), requestPath, portal::requestInterface, QStringLiteral("Response"), this,
-                  SLOT(takeResponse(uint, QVariantMap)));
+                  SLOT(takeResponse(uint, QVariantMap))); // clazy:exclude=connect-not-normalized
 }
 
 void PortalPicking::takeResponse(uint response, const QVariantMap &results)
