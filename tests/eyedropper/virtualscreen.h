@@ -1,12 +1,14 @@
 #pragma once
 
 #include <QByteArray>
+#include <QImage>
 #include <QProcess>
 #include <QString>
 
 #include <cstdio>
 
 #include <unistd.h>
+#include <xcb/xcb.h>
 
 /** An X server without a display, with a pointer and keys that the test moves. */
 class VirtualScreen
@@ -62,3 +64,20 @@ private:
     QProcess m_server;
     QString m_name;
 };
+
+/** Makes the picture the background of the whole screen. */
+inline void showOnRoot(xcb_connection_t *connection, const QImage &picture)
+{
+    const xcb_screen_t *screen = xcb_setup_roots_iterator(xcb_get_setup(connection)).data;
+    const auto width = static_cast<quint16>(picture.width());
+    const auto height = static_cast<quint16>(picture.height());
+    const xcb_pixmap_t pixmap = xcb_generate_id(connection);
+    const xcb_gcontext_t context = xcb_generate_id(connection);
+    xcb_create_pixmap(connection, screen->root_depth, pixmap, screen->root, width, height);
+    xcb_create_gc(connection, context, pixmap, 0, nullptr);
+    xcb_put_image(connection, XCB_IMAGE_FORMAT_Z_PIXMAP, pixmap, context, width, height, 0, 0, 0, screen->root_depth,
+                  static_cast<quint32>(picture.sizeInBytes()), picture.constBits());
+    xcb_change_window_attributes(connection, screen->root, XCB_CW_BACK_PIXMAP, &pixmap);
+    xcb_clear_area(connection, 0, screen->root, 0, 0, 0, 0);
+    xcb_flush(connection);
+}
