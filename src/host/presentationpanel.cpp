@@ -20,19 +20,16 @@ constexpr double shadowRadius = 40;
 constexpr double shadowDrop = 6;
 constexpr QColor shadowColor(0, 0, 0, 64);
 constexpr double arrowHalfWidth = 13;
-/** Nothing behind the panel is blurred, so the material lets just enough through to tell that something is there. */
-constexpr double materialOpacity = 0.985;
 
 QColor panelColor(bool dark)
 {
     return dark ? QColor(0x1c, 0x1c, 0x1e) : QColor(0xff, 0xff, 0xff);
 }
 
+/** Nothing behind the panel is blurred: what showed through would only look like dirt. */
 QColor materialColor(bool dark)
 {
-    QColor color = dark ? QColor(0x22, 0x22, 0x24) : QColor(0xf9, 0xf9, 0xfa);
-    color.setAlphaF(static_cast<float>(materialOpacity));
-    return color;
+    return dark ? QColor(0x26, 0x26, 0x29) : QColor(0xf2, 0xf2, 0xf6);
 }
 
 QColor edgeColor(bool dark)

@@ -85,6 +85,9 @@ Item {
                 text: segment.modelData
                 textFormat: Text.PlainText
                 elide: Text.ElideRight
+                // A long word is made smaller before it is cut.
+                fontSizeMode: Text.HorizontalFit
+                minimumPixelSize: 11
                 horizontalAlignment: Text.AlignHCenter
                 verticalAlignment: Text.AlignVCenter
                 font: Theme.subheadlineFont

@@ -30,14 +30,12 @@ Item {
         component: ColorComponent.Opacity
     }
 
-    Rectangle {
+    Divider {
         id: divider
 
         y: opacity.height + footer.rowSpacing
         width: parent.width
-        height: 1 / Screen.devicePixelRatio
         visible: opacity.visible
-        color: Theme.separator
     }
 
     ColorWell {

@@ -2,7 +2,6 @@
 #include "apps/gallery/messagelog.h"
 #include "apps/gallery/pickrecorder.h"
 #include "apps/gallery/postershape.h"
-#include "apps/gallery/vividarea.h"
 
 #include <QPainter>
 #include <QTest>
@@ -19,8 +18,6 @@ private Q_SLOTS:
     void logKeepsTheNewestMessages();
     void pointsOfThePosterBelongToParts_data();
     void pointsOfThePosterBelongToParts();
-    void colorfulBandIsFound_data();
-    void colorfulBandIsFound();
     void commandLineIsUnderstood_data();
     void commandLineIsUnderstood();
 };
@@ -91,35 +88,6 @@ void GalleryTest::pointsOfThePosterBelongToParts()
     QVERIFY(!shape.contains(point)); // Without a size there is nothing to touch.
     shape.setSize(QSizeF(300, 420));
     QTEST(shape.contains(point / 2), "inside");
-}
-
-void GalleryTest::colorfulBandIsFound_data()
-{
-    QTest::addColumn<QList<QRect>>("colorful");
-    QTest::addColumn<QRect>("within");
-    QTest::addColumn<QRect>("found");
-
-    const QRect all(0, 0, 100, 100);
-    QTest::newRow("nothing") << QList<QRect>{} << all << QRect();
-    QTest::newRow("one band") << QList<QRect>{{10, 20, 80, 50}} << all << QRect(10, 20, 80, 50);
-    QTest::newRow("the taller of two") << QList<QRect>{{0, 0, 100, 10}, {10, 40, 80, 30}} << all
-                                       << QRect(10, 40, 80, 30);
-    QTest::newRow("not what is narrow") << QList<QRect>{{0, 0, 40, 90}} << all << QRect();
-    QTest::newRow("only inside") << QList<QRect>{{0, 0, 100, 100}} << QRect(20, 30, 40, 50) << QRect(20, 30, 40, 50);
-    QTest::newRow("beyond the picture") << QList<QRect>{{0, 0, 100, 100}} << QRect(-50, -50, 300, 300) << all;
-}
-
-void GalleryTest::colorfulBandIsFound()
-{
-    QFETCH(QList<QRect>, colorful);
-    QFETCH(QRect, within);
-    QImage picture(100, 100, QImage::Format_RGB32);
-    picture.fill(Qt::gray);
-    QPainter painter(&picture);
-    for (const QRect &rectangle : std::as_const(colorful))
-        painter.fillRect(rectangle, QColor(20, 60, 110));
-    painter.end();
-    QTEST(vividArea(picture, within), "found");
 }
 
 void GalleryTest::commandLineIsUnderstood_data()

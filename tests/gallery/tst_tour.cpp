@@ -1,3 +1,4 @@
+#include <QCryptographicHash>
 #include <QDir>
 #include <QFile>
 #include <QImage>
@@ -16,6 +17,7 @@ private Q_SLOTS:
     void initTestCase();
     void leavesPictures_data();
     void leavesPictures();
+    void theBookShowsEveryFace();
     void strokesEndInFinalPicks();
     void aFolderThatCannotBeMadeIsAnError();
 
@@ -79,6 +81,24 @@ void TourTest::leavesPictures()
     const QImage image = picture(QString::fromLatin1(QTest::currentDataTag()));
     QCOMPARE(image.size(), size);
     QCOMPARE(image.pixelColor(0, 0).lightnessF() < 0.5f, dark);
+}
+
+void TourTest::theBookShowsEveryFace()
+{
+    const QDir folder(m_folder.path());
+    const QStringList faces = folder.entryList({QStringLiteral("picker-*.png")});
+    QCOMPARE(faces.size(), 72);
+    QSet<QByteArray> different;
+    for (const QString &face : faces) {
+        const QImage image(folder.filePath(face));
+        QCOMPARE(image.width(), face.contains(u"landscape") ? 568 : 360);
+        QCOMPARE(image.pixelColor(2, 2).lightnessF() < 0.5f, face.contains(u"-dark-"));
+        different.insert(QCryptographicHash::hash(
+            {reinterpret_cast<const char *>(image.constBits()), image.sizeInBytes()}, QCryptographicHash::Md5));
+    }
+    QCOMPARE(different.size(), faces.size());
+    QVERIFY(!picture(QStringLiteral("picture-book-light")).isNull());
+    QVERIFY(!picture(QStringLiteral("picture-book-dark")).isNull());
 }
 
 void TourTest::strokesEndInFinalPicks()

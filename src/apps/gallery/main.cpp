@@ -1,10 +1,12 @@
 #include "apps/gallery/gallery.h"
 #include "apps/gallery/galleryoptions.h"
+#include "apps/gallery/picturebook.h"
 #include "apps/gallery/tourscript.h"
 
 #include <QDir>
 #include <QGuiApplication>
 #include <QQmlApplicationEngine>
+#include <QTemporaryDir>
 
 #include <cstdio>
 
@@ -45,10 +47,12 @@ bool startTour(QQuickWindow *window, Gallery &gallery, const GalleryOptions &opt
         return false;
     }
     auto *script = new TourScript(window, &gallery, folder, &tour);
-    if (options.onlyScaledPicture)
+    if (options.onlyScaledPicture) {
         script->addScaledPicture();
-    else
+    } else {
         script->addEverything();
+        (new PictureBook(folder, &tour))->addEverything();
+    }
     QObject::connect(&tour, &Tour::finished, qApp, &QCoreApplication::exit, Qt::QueuedConnection);
     tour.start();
     return true;
@@ -70,6 +74,11 @@ int main(int argc, char *argv[])
     // Pictures shall look the same everywhere, and without a display there is no other way to draw.
     if (parsed.options->tourFolder || QGuiApplication::platformName() == QStringLiteral("offscreen"))
         QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
+
+    // What the tour finds and leaves is its own: a picker of a user who has never opened one.
+    QTemporaryDir tourData;
+    if (parsed.options->tourFolder)
+        qputenv("XDG_DATA_HOME", QFile::encodeName(tourData.path()));
 
     FVColorPickerViewController::startServiceAhead();
     Gallery gallery;

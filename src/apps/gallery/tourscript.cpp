@@ -1,15 +1,12 @@
 #include "apps/gallery/tourscript.h"
 
-#include "apps/gallery/vividarea.h"
+#include "apps/gallery/pickerplaces.h"
 
 #include <QCoreApplication>
 #include <QDir>
 
-#include <chrono>
-
 namespace favrin::gallery {
 
-using namespace std::chrono_literals;
 using Presentation = PickerPresenter::Presentation;
 
 namespace {
@@ -17,9 +14,6 @@ namespace {
 constexpr QSize desktopSize(1240, 820);
 constexpr QSize tabletSize(820, 1180);
 constexpr QSize phoneSize(390, 844);
-
-/** Whatever moves, or is yet to arrive from the picker's process, shows within this time. */
-constexpr std::chrono::milliseconds stillness = 120ms;
 
 /** What lists create is a child in the scene only, not in the tree of objects. */
 QQuickItem *findItem(QQuickItem *root, const QString &name)
@@ -75,7 +69,13 @@ const TourScript::Scene TourScript::embedded{QStringLiteral("embeds the picker i
                                              {0.15, 0.15}};
 
 TourScript::TourScript(QQuickWindow *window, Gallery *gallery, const QString &folder, Tour *tour)
-    : QObject(tour), m_window(window), m_gallery(gallery), m_folder(folder), m_tour(tour), m_finger(window)
+    : QObject(tour)
+    , m_window(window)
+    , m_gallery(gallery)
+    , m_folder(folder)
+    , m_tour(tour)
+    , m_finger(window)
+    , m_stillness(window)
 {
 }
 
@@ -115,7 +115,7 @@ void TourScript::addStep(const QString &text, Tour::Action action, Tour::Conditi
         text,
         [this, action = std::move(action)] {
             // What was still before this step says nothing about what it brings.
-            m_lastGrab = {};
+            m_stillness.forget();
             if (action)
                 action();
         },
@@ -141,12 +141,8 @@ void TourScript::addSurroundings(Appearance appearance, Direction direction, QSi
 void TourScript::addScene(const Scene &scene, const QString &picture)
 {
     addTap(QStringLiteral("selects a part of the poster"), scene.part, [] { return true; });
-    addTap(scene.text, scene.button, [this] {
-        if (!m_gallery->presenter()->isReady() || !isOpaque(m_gallery->picker()->view()) || !isStill())
-            return false;
-        m_colors = colors();
-        return !m_colors.isEmpty();
-    });
+    addTap(scene.text, scene.button,
+           [this] { return m_gallery->presenter()->isReady() && isOpaque(m_gallery->picker()->view()) && isStill(); });
     if (m_recorder)
         addStroke(scene);
     addPicture(picture);
@@ -191,7 +187,7 @@ void TourScript::addPicture(const QString &name)
     addStep(QStringLiteral("takes the picture %1").arg(path), {}, [this, path] {
         if (!isStill())
             return false;
-        if (!m_lastGrab.save(path))
+        if (!m_stillness.picture().save(path))
             m_tour->fail(QStringLiteral("the picture cannot be written"));
         return true;
     });
@@ -238,31 +234,13 @@ void TourScript::tap(const QString &itemName)
         m_finger.tap(target->mapToScene(target->boundingRect().center()));
 }
 
-QRectF TourScript::colors() const
+QPointF TourScript::colorAt(QPointF place) const
 {
     const QQuickItem *view = m_gallery->picker()->view();
     if (!view)
         return {};
-    const double scale = m_window->effectiveDevicePixelRatio();
-    const QRectF bounds = view->mapRectToScene(view->boundingRect());
-    const QRectF area = vividArea(m_lastGrab, QRectF(bounds.topLeft() * scale, bounds.size() * scale).toRect());
-    return {area.topLeft() / scale, area.size() / scale};
-}
-
-QPointF TourScript::colorAt(QPointF place) const
-{
-    return m_colors.topLeft() + QPointF(place.x() * m_colors.width(), place.y() * m_colors.height());
-}
-
-bool TourScript::isStill()
-{
-    if (m_sinceGrab.isValid() && m_sinceGrab.elapsed() < stillness.count())
-        return false;
-    const QImage grab = m_window->grabWindow();
-    const bool still = grab == m_lastGrab;
-    m_lastGrab = grab;
-    m_sinceGrab.start();
-    return still;
+    const QRectF colors = PickerPlaces(view->size(), m_gallery->picker()->layoutDirection()).tabArea();
+    return view->mapToScene(colors.topLeft() + QPointF(place.x() * colors.width(), place.y() * colors.height()));
 }
 
 } // namespace favrin::gallery

@@ -3,10 +3,9 @@
 #include "apps/gallery/fingertip.h"
 #include "apps/gallery/gallery.h"
 #include "apps/gallery/pickrecorder.h"
+#include "apps/gallery/stillness.h"
 #include "apps/gallery/tour.h"
 
-#include <QElapsedTimer>
-#include <QImage>
 #include <QProcess>
 #include <QSize>
 
@@ -45,23 +44,20 @@ private:
 
     QQuickItem *item(const QString &name) const;
     void tap(const QString &itemName);
-    /** Where the picker shows its colors, in points of the window. */
-    QRectF colors() const;
+    /** A place among the picker's colors, in fractions of their width and height, as a point of the window. */
     QPointF colorAt(QPointF place) const;
-    bool isStill();
+    bool isStill() { return m_stillness.isReached(); }
 
     QQuickWindow *m_window;
     Gallery *m_gallery;
     QString m_folder;
     Tour *m_tour;
     Fingertip m_finger;
+    Stillness m_stillness;
     PickRecorder *m_recorder = nullptr;
     QProcess m_scaledProcess;
 
-    QRectF m_colors;
     int m_picksBefore = 0;
-    QImage m_lastGrab;
-    QElapsedTimer m_sinceGrab;
 };
 
 } // namespace favrin::gallery
