@@ -6,6 +6,7 @@
 #include <array>
 #include <charconv>
 #include <cmath>
+#include <numbers>
 #include <span>
 #include <string>
 #include <vector>
@@ -59,20 +60,28 @@ std::optional<SomeColor> fromHexDigits(std::string_view text, ColorSpace space)
     return hasAlpha ? fromBytes(number >> 8U, (number & 0xffU) / 255.0, space) : fromBytes(number, 1.0, space);
 }
 
+std::optional<double> number(std::string_view text)
+{
+    if (text.starts_with('+') && !text.starts_with("+-"))
+        text.remove_prefix(1);
+    double value = 0.0;
+    const auto [end, error] =
+        std::from_chars(text.data(), text.data() + text.size(), value, std::chars_format::general);
+    if (text.empty() || error != std::errc() || end != text.data() + text.size() || !std::isfinite(value))
+        return std::nullopt;
+    return value;
+}
+
 /** A number, or a percentage of @p whole, divided by @p whole and clipped to 0…1. */
 std::optional<double> part(std::string_view text, double whole)
 {
     const bool isPercentage = text.ends_with('%');
     if (isPercentage)
         text.remove_suffix(1);
-    if (text.starts_with('+') && !text.starts_with("+-"))
-        text.remove_prefix(1);
-    double number = 0.0;
-    const auto [end, error] =
-        std::from_chars(text.data(), text.data() + text.size(), number, std::chars_format::general);
-    if (text.empty() || error != std::errc() || end != text.data() + text.size() || !std::isfinite(number))
+    const auto value = number(text);
+    if (!value)
         return std::nullopt;
-    return std::clamp(number / (isPercentage ? 100.0 : whole), 0.0, 1.0);
+    return std::clamp(*value / (isPercentage ? 100.0 : whole), 0.0, 1.0);
 }
 
 /** What stands between the separators: blanks, or a comma or slash with or without blanks. None for an empty piece. */
@@ -108,6 +117,65 @@ std::optional<SomeColor> fromParts(std::span<const std::string_view> pieces, dou
     return SomeColor(values[0], values[1], values[2], values[3], space);
 }
 
+/** Where on the circle, 0 to 1; a number without a unit counts degrees. */
+std::optional<double> turn(std::string_view text)
+{
+    struct Unit
+    {
+        std::string_view name;
+        double perTurn;
+    };
+    // "grad" before "rad", which it ends with.
+    constexpr std::array<Unit, 4> units = {
+        {{"deg", 360.0}, {"grad", 400.0}, {"rad", 2.0 * std::numbers::pi}, {"turn", 1.0}}};
+    double perTurn = 360.0;
+    for (const auto &unit : units) {
+        if (text.ends_with(unit.name)) {
+            text.remove_suffix(unit.name.size());
+            perTurn = unit.perTurn;
+            break;
+        }
+    }
+    const auto angle = number(text);
+    if (!angle)
+        return std::nullopt;
+    const double turns = *angle / perTurn;
+    return turns - std::floor(turns);
+}
+
+/** Red, green and blue of a hue on the circle, with full saturation. */
+std::array<double, 3> pureColor(double turns)
+{
+    const auto level = [turns](double offset) {
+        const double k = std::fmod(offset + turns * 12.0, 12.0);
+        return 0.5 - 0.5 * std::max(-1.0, std::min({k - 3.0, 9.0 - k, 1.0}));
+    };
+    return {level(0.0), level(8.0), level(4.0)};
+}
+
+/** hsl(): hue, saturation, lightness; hwb(): hue, whiteness, blackness. */
+std::optional<SomeColor> fromHue(std::span<const std::string_view> pieces, bool isHwb)
+{
+    if (pieces.size() != 3 && pieces.size() != 4)
+        return std::nullopt;
+    const auto hue = turn(pieces[0]);
+    const auto first = part(pieces[1], 100.0);
+    const auto second = part(pieces[2], 100.0);
+    const auto alpha = pieces.size() == 4 ? part(pieces[3], 1.0) : 1.0;
+    if (!hue || !first || !second || !alpha)
+        return std::nullopt;
+    std::array<double, 3> rgb = pureColor(*hue);
+    for (double &component : rgb) {
+        if (!isHwb)
+            component = *second + *first * std::min(*second, 1.0 - *second) * (2.0 * component - 1.0);
+        else if (*first + *second >= 1.0)
+            component = *first / (*first + *second);
+        else
+            component = *first + component * (1.0 - *first - *second);
+    }
+    return SomeColor(rgb[0], rgb[1], rgb[2], *alpha, ColorSpace::sRGB);
+}
+
 std::optional<SomeColor> fromFunction(std::string_view text)
 {
     const auto opening = text.find('(');
@@ -119,6 +187,8 @@ std::optional<SomeColor> fromFunction(std::string_view text)
         return std::nullopt;
     if (name == "rgb" || name == "rgba")
         return fromParts(*pieces, 255.0, ColorSpace::sRGB);
+    if (name == "hsl" || name == "hsla" || name == "hwb")
+        return fromHue(*pieces, name == "hwb");
     const auto components = std::span(*pieces).subspan(1);
     if (name == "color" && pieces->front() == "srgb")
         return fromParts(components, 1.0, ColorSpace::sRGB);

@@ -48,6 +48,15 @@ void CssColorTest::isUnderstood_data()
     row("rgb(0 97 253/.2)", "0061FD", 0.2);
     row("rgb(100%, 0%, 50%)", "FF0080");
     row("rgb(999, -5, 1e2)", "FF0064");
+    row("hsl(120, 100%, 25%)", "008000");
+    row("hsla(0 0% 50% / 20%)", "808080", 0.2);
+    row("hsl(-150deg 100 50)", "0080FF");
+    row("hsl(0.5turn 100% 50%)", "00FFFF");
+    row("hsl(400grad, 50%, 75%)", "DF9F9F");
+    row("hsl(3.14159265358979rad 100% 50%)", "00FFFF");
+    row("hwb(210 0% 0%)", "0080FF");
+    row("hwb(90 20% 40% / .5)", "669933", 0.5);
+    row("hwb(90 60% 90%)", "666666");
     row("color(display-p3 1 0.5 0)", "FF8000", 1.0, true);
     row("color(display-p3 100% 50% 0% / 0.2)", "FF8000", 0.2, true);
     row("color(srgb 1 0.5 0)", "FF8000");
@@ -74,6 +83,7 @@ void CssColorTest::isNoColor_data()
         QStringLiteral("| |\"\"|#|##fff|12|12345|1234567|123456789|gggggg|-12345|0x1234|# ffffff|reddish|"
                        "transparent|rgb|rgb(|rgb()|rgb(1)|rgb(1,2)|rgb(1,2,3,4,5)|rgb(1,,2,3)|rgb(1,2,3,)|"
                        "rgb(a,b,c)|rgb(1 2 3|rgb(1deg 2 3)|rgb(nan, 0, 0)|rgb(inf, 0, 0)|rgb(+-1,0,0)|"
+                       "hsl(1,2)|hsl(1turns 2 3)|hsl(deg 2 3)|hsl(1% 2 3)|hwb(nan 0 0)|hsl(1e400 2 3)|"
                        "rgb(%,0,0)|rgb(0x10,0,0)|color(1 0 0)|color(display-p3)|color(display-p3 1 0)|"
                        "color(rec2020 1 0 0)|red blue|ﬀﬀﬀ|١٢٣٤٥٦")
             .split(u'|');
