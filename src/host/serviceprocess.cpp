@@ -139,9 +139,10 @@ QString ServiceProcess::start(int socket)
 
     posix_spawn_file_actions_t actions;
     posix_spawn_file_actions_init(&actions);
-    posix_spawn_file_actions_addopen(&actions, 0, "/dev/null", O_RDONLY, 0);
-    // Onto itself it only loses its close-on-exec flag.
+    // First, since an app that has closed its standard input has the socket there. Onto itself it only loses its
+    // close-on-exec flag.
     posix_spawn_file_actions_adddup2(&actions, socket, serviceSocket);
+    posix_spawn_file_actions_addopen(&actions, 0, "/dev/null", O_RDONLY, 0);
     posix_spawn_file_actions_addclosefrom_np(&actions, serviceSocket + 1);
 
     posix_spawnattr_t attributes;

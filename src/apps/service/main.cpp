@@ -1,4 +1,5 @@
 #include "apps/service/pickerservice.h"
+#include "apps/service/serviceconfinement.h"
 #include "service/fvcolorpickerserviceviewcontroller.h"
 #include "shell/colorpickerviewfactory.h"
 
@@ -40,12 +41,16 @@ void dropFarewell(QtMsgType type, const QMessageLogContext &context, const QStri
 
 int main(int argc, char *argv[])
 {
-    if (qEnvironmentVariableIsEmpty("WAYLAND_SOCKET")) {
+    bool isSocket = false;
+    const int socket = qEnvironmentVariableIntValue("WAYLAND_SOCKET", &isSocket);
+    if (!isSocket || socket < 0) {
         std::fputs("favrin-color-picker-service: started by applications that show a color picker, not by hand\n",
                    stderr);
         return noHost;
     }
     previousMessageHandler = qInstallMessageHandler(dropFarewell);
+    // Before anything is read from the host and before there is a second thread.
+    favrin::apps::confineService(socket);
     prepareEnvironment();
     QGuiApplication application(argc, argv);
     QGuiApplication::setApplicationName(QStringLiteral("favrin-color-picker-service"));

@@ -122,6 +122,8 @@ void PickerService::build()
     m_window->setMinimumSize(QSize(1, 1));
     m_window->setMaximumSize(QSize(remote::limits::largestSurface, remote::limits::largestSurface));
     m_front->view()->setParentItem(m_window->contentItem());
+    m_focusBorder = std::make_unique<FocusBorder>(
+        *m_window, [this](remote::FocusDirection direction) { return passFocusOn(direction); });
     connect(m_window.get(), &QQuickWindow::widthChanged, this, &PickerService::followWindowSize);
     connect(m_window.get(), &QQuickWindow::heightChanged, this, &PickerService::followWindowSize);
     connect(m_front.get(), &service::FVColorPickerServiceFront::preferredContentSizeChanged, this,
@@ -155,6 +157,21 @@ void PickerService::shouldPresent()
     // Keys go to the picker's root view, which passes Tab on and ends the presentation on Escape.
     if (auto *picker = m_front->childViewController())
         picker->view()->forceActiveFocus();
+}
+
+void PickerService::focusWillEnter(remote::FocusDirection direction)
+{
+    if (m_focusBorder)
+        m_focusBorder->enter(direction);
+}
+
+bool PickerService::passFocusOn(remote::FocusDirection direction)
+{
+    // A picker that lies over the host's content keeps the focus until it goes.
+    if (m_traits->presentationContext != remote::PresentationContext::Embedded)
+        return false;
+    m_connection.sendFocusDidLeave(direction);
+    return true;
 }
 
 void PickerService::presentationWillEnd()

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "apps/service/focusborder.h"
 #include "remote/client/remoteviewconnection.h"
 
 #include <QObject>
@@ -34,6 +35,7 @@ public:
 private:
     void traitsDidChange(const remote::Traits &traits) override;
     void shouldPresent() override;
+    void focusWillEnter(remote::FocusDirection direction) override;
     void presentationWillEnd() override;
     remote::RemoteViewController *remoteViewController() override;
 
@@ -42,11 +44,13 @@ private:
     void warmUp();
     void settleBeforePresenting();
     void followWindowSize();
+    bool passFocusOn(remote::FocusDirection direction);
 
     remote::client::RemoteViewConnection m_connection;
     std::optional<remote::Traits> m_traits;
     std::unique_ptr<service::FVColorPickerServiceFront> m_front;
     std::unique_ptr<QQuickWindow> m_window;
+    std::unique_ptr<FocusBorder> m_focusBorder;
 };
 
 } // namespace favrin::apps

@@ -192,4 +192,20 @@ bool setAside(const fs::path &file, const std::optional<FileIdentity> &damaged, 
     return lock.synchronise();
 }
 
+std::vector<fs::path> settle(const fs::path &file, FolderLock::Clock::time_point deadline)
+{
+    if (file.empty())
+        return {};
+    makeFolder(folderOf(file));
+    if (inspect(file) == Condition::Damaged)
+        setAside(file, {}, deadline);
+    std::vector<fs::path> folders = {folderOf(file)};
+    std::error_code error;
+    if (fs::is_symlink(file, error))
+        folders.push_back(folderOf(fs::weakly_canonical(file, error)));
+    if (fs::is_regular_file(file, error))
+        ::chmod(file.c_str(), 0600);
+    return folders;
+}
+
 } // namespace favrin::platform::defaultsfile

@@ -5,6 +5,7 @@
 #include <chrono>
 #include <filesystem>
 #include <optional>
+#include <vector>
 
 namespace favrin::platform {
 
@@ -75,6 +76,12 @@ private:
  */
 bool setAside(const std::filesystem::path &file, const std::optional<FileIdentity> &damaged,
               FolderLock::Clock::time_point deadline);
+
+/**
+ * Does in advance what a process cannot do any more once it may write in a few folders only: makes the folder, and sets
+ * aside what is no file. Gives the folders in which the store writes: that of @p file, and that of what it links to.
+ */
+std::vector<std::filesystem::path> settle(const std::filesystem::path &file, FolderLock::Clock::time_point deadline);
 
 } // namespace defaultsfile
 
