@@ -1,0 +1,197 @@
+#include "onepointer.h"
+#include "slidershost.h"
+
+#include <QTemporaryDir>
+
+namespace {
+
+constexpr int gridTab = 0;
+constexpr int spectrumTab = 1;
+constexpr int slidersTab = 2;
+
+bool isAbout(double value, double wanted)
+{
+    return std::abs(value - wanted) < 1e-6;
+}
+
+bool isAbout(const FVColor &color, double red, double green, double blue)
+{
+    return isAbout(color.red(), red) && isAbout(color.green(), green) && isAbout(color.blue(), blue);
+}
+
+/** Whether the pixels show the color, with a rounding to spare. */
+bool isAbout(QRgb pixel, const QColor &color)
+{
+    const auto isNear = [](int a, int b) { return std::abs(a - b) <= 1; };
+    return isNear(qRed(pixel), color.red()) && isNear(qGreen(pixel), color.green()) &&
+           isNear(qBlue(pixel), color.blue());
+}
+
+} // namespace
+
+/** The spectrum and the tab picker, from the app's window to the picker's process and back. */
+class TabsRoadTest : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void initTestCase();
+    void cleanup();
+
+    void aDragAcrossTheSpectrumKeepsOpacityAndSpace_data();
+    void aDragAcrossTheSpectrumKeepsOpacityAndSpace();
+    void theLensAndTheFieldShowWhatIsPicked_data();
+    void theLensAndTheFieldShowWhatIsPicked();
+    void theTabThatWasLeftIsShownAgain_data();
+    void theTabThatWasLeftIsShownAgain();
+
+private:
+    QTemporaryDir m_data;
+    const QPointingDevice *m_touchScreen = QTest::createTouchDevice();
+};
+
+void TabsRoadTest::initTestCase()
+{
+    QVERIFY(m_data.isValid());
+    qputenv("FAVRIN_DEFAULTS_FILE", QFile::encodeName(m_data.path() + QStringLiteral("/defaults.sqlite")));
+}
+
+void TabsRoadTest::cleanup()
+{
+    QTRY_VERIFY(servicesOf(getpid()).empty());
+    // Each test begins on the first tab, with nothing stored.
+    for (const auto &file : QDir(m_data.path()).entryInfoList(QDir::Files))
+        QVERIFY(QFile::remove(file.filePath()));
+}
+
+void TabsRoadTest::aDragAcrossTheSpectrumKeepsOpacityAndSpace_data()
+{
+    QTest::addColumn<QString>("space");
+    QTest::addColumn<bool>("byTouch");
+    QTest::newRow("sRGB, finger") << FVColor::sRGBName() << true;
+    QTest::newRow("sRGB, mouse") << FVColor::sRGBName() << false;
+    QTest::newRow("Display P3, finger") << FVColor::displayP3Name() << true;
+    QTest::newRow("Display P3, mouse") << FVColor::displayP3Name() << false;
+}
+
+void TabsRoadTest::aDragAcrossTheSpectrumKeepsOpacityAndSpace()
+{
+    QFETCH(QString, space);
+    QFETCH(bool, byTouch);
+    RoadHost host;
+    host.picker.setSelectedColor(FVColor(0.25, 0.5, 0.75, 0.4, space));
+    host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+    QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.tabSegment(spectrumTab));
+
+    Pointer pointer(host.window, byTouch ? m_touchScreen : nullptr);
+    pointer.press(host.inTab(0.5, 0.3));
+    QTRY_VERIFY(host.picks.size() >= 2);
+    pointer.move(host.inTab(0, 0.4));
+    QTRY_VERIFY(isAbout(host.picks.back().color, 1, 1, 1));
+    pointer.move(host.inTab(1.3, 0.9));
+    QTRY_VERIFY(isAbout(host.picks.back().color, 0, 0, 0));
+    QVERIFY(host.picks.back().isVolatile);
+    pointer.release(host.inTab(1.3, 0.9));
+    QTRY_VERIFY(!host.picks.back().isVolatile);
+
+    QVERIFY(isAbout(host.picks.back().color, 0, 0, 0));
+    for (std::size_t i = 0; i < host.picks.size(); ++i) {
+        QCOMPARE(host.picks[i].isVolatile, i + 1 < host.picks.size());
+        QCOMPARE(host.picks[i].color.alpha(), 0.4);
+        QCOMPARE(host.picks[i].space, space);
+    }
+}
+
+void TabsRoadTest::theLensAndTheFieldShowWhatIsPicked_data()
+{
+    QTest::addColumn<QPointF>("place");
+    QTest::addColumn<QString>("space");
+    QTest::newRow("tint") << QPointF(0.2, 0.15) << FVColor::sRGBName();
+    QTest::newRow("full color") << QPointF(0.5, 0.6) << FVColor::sRGBName();
+    QTest::newRow("shade") << QPointF(0.8, 0.35) << FVColor::displayP3Name();
+}
+
+void TabsRoadTest::theLensAndTheFieldShowWhatIsPicked()
+{
+    QFETCH(QPointF, place);
+    QFETCH(QString, space);
+    constexpr int ringRadius = 13;
+    RoadHost host;
+    // Of a width that makes the field a whole number of points high: its pixels are then exactly those of the window.
+    QQuickItem container(host.window.contentItem());
+    container.setSize(QSizeF(392, 690));
+    host.picker.setSelectedColor(FVColor(0.25, 0.5, 0.75, 1, space));
+    host.picker.embed(&container);
+    QTRY_VERIFY(host.isReady());
+    QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.tabSegment(spectrumTab));
+
+    // The middle of a pixel, which is what the field's pixel shows.
+    const QPoint pixel = host.inTab(place.x(), place.y());
+    const QPointF middle = QPointF(pixel) + QPointF(0.5, 0.5);
+    const auto send = [&host](QEvent::Type type, QPointF position) {
+        const auto button = type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton;
+        const auto held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
+        QMouseEvent event(type, position, position, button, held, {});
+        QCoreApplication::sendEvent(&host.window, &event);
+    };
+    send(QEvent::MouseButtonPress, middle);
+    QTRY_VERIFY(host.picks.size() >= 2);
+    const QColor picked = host.picks.back().color.toQColor();
+    const auto isRing = [](QRgb color) { return color == 0xffffffff; };
+    QTRY_VERIFY(isRing(host.window.grabWindow().pixel(pixel + QPoint(ringRadius, 0))));
+    const QImage underTheFinger = host.window.grabWindow();
+    QVERIFY(isAbout(underTheFinger.pixel(pixel), picked));
+    for (const QPoint direction : {QPoint(-1, 0), QPoint(0, -1), QPoint(0, 1)})
+        QVERIFY(isRing(underTheFinger.pixel(pixel + ringRadius * direction)));
+
+    send(QEvent::MouseMove, host.inTab(0.5, 0.9));
+    QTRY_VERIFY(isRing(host.window.grabWindow().pixel(host.inTab(0.5, 0.9) + QPoint(ringRadius, 0))));
+    const QRgb field = host.window.grabWindow().pixel(pixel);
+    QVERIFY2(isAbout(field, picked), qPrintable(QColor(field).name() + QLatin1Char(' ') + picked.name()));
+    send(QEvent::MouseButtonRelease, host.inTab(0.5, 0.9));
+    QTRY_VERIFY(!host.picks.back().isVolatile);
+}
+
+void TabsRoadTest::theTabThatWasLeftIsShownAgain_data()
+{
+    QTest::addColumn<QList<int>>("tabs");
+    // What a click gives in this tab and in no other.
+    QTest::addColumn<QPointF>("place");
+    QTest::addColumn<FVColor>("color");
+    QTest::newRow("grid") << QList{slidersTab, gridTab} << QPointF(0.04, 0.05) << FVColor(1, 1, 1);
+    QTest::newRow("spectrum") << QList{spectrumTab} << QPointF(0, 0.5) << FVColor(1, 1, 1);
+    QTest::newRow("sliders") << QList{spectrumTab, slidersTab} << QPointF(0.01, 0.13) << FVColor(0, 0.5, 0.25);
+}
+
+void TabsRoadTest::theTabThatWasLeftIsShownAgain()
+{
+    QFETCH(QList<int>, tabs);
+    QFETCH(QPointF, place);
+    QFETCH(FVColor, color);
+    SlidersHost host;
+    host.picker.setSelectedColor(FVColor(0.75, 0.5, 0.25));
+    host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+    for (const int tab : tabs)
+        host.click(host.tabSegment(tab));
+    QSignalSpy finished(&host.picker, &FVColorPickerViewController::colorPickerDidFinish);
+    host.picker.dismiss();
+    QTRY_COMPARE(finished.size(), 1);
+
+    host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+    host.click(host.inTab(place.x(), place.y()));
+    QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+    QTRY_VERIFY(isAbout(host.picks.back().color, color.red(), color.green(), color.blue()));
+}
+
+int main(int argc, char *argv[])
+{
+    QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
+    QGuiApplication application(argc, argv);
+    TabsRoadTest test;
+    return QTest::qExec(&test, argc, argv);
+}
+
+#include "tst_tabsroad.moc"
