@@ -5,7 +5,7 @@
 #include <QProcess>
 #include <QString>
 
-#include <cstdio>
+#include <cstdlib>
 
 #include <unistd.h>
 #include <xcb/xcb.h>
@@ -79,5 +79,6 @@ inline void showOnRoot(xcb_connection_t *connection, const QImage &picture)
                   static_cast<quint32>(picture.sizeInBytes()), picture.constBits());
     xcb_change_window_attributes(connection, screen->root, XCB_CW_BACK_PIXMAP, &pixmap);
     xcb_clear_area(connection, 0, screen->root, 0, 0, 0, 0);
-    xcb_flush(connection);
+    // It has happened when the server answers.
+    std::free(xcb_get_input_focus_reply(connection, xcb_get_input_focus(connection), nullptr));
 }

@@ -122,21 +122,30 @@ void LoupePicking::followPointer()
 
 void LoupePicking::floatPicking()
 {
-    if (m_hasEnded || !m_window || m_takeInput.isActive())
+    if (m_hasEnded || !m_follow.isActive() || m_takeInput.isActive())
         return;
-    m_follow.stop();
-    m_window->setListening(true);
     m_takeInput.start();
     takeInput();
-    Q_EMIT floated();
 }
 
 void LoupePicking::takeInput()
 {
+    // Neither can be had before the window is on the screen, nor while another app has it.
     const bool hasPointer = m_window->setMouseGrabEnabled(true);
     const bool hasKeys = m_window->setKeyboardGrabEnabled(true);
+    if (hasPointer && m_follow.isActive())
+        startListening();
     if (hasPointer && hasKeys)
         m_takeInput.stop();
+}
+
+void LoupePicking::startListening()
+{
+    // From here on the pointer tells of its moves itself; the last one before may have been missed.
+    m_follow.stop();
+    followPointer();
+    m_window->setListening(true);
+    Q_EMIT floated();
 }
 
 void LoupePicking::cancel()

@@ -31,6 +31,7 @@ private:
     void startOnDisplay();
     void followPointer();
     void takeInput();
+    void startListening();
     void end(PickingEnd how);
 
     QString m_displayIdentifier;
