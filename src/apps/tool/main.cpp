@@ -5,6 +5,7 @@
 
 #include <csignal>
 #include <cstdio>
+#include <cstdlib>
 
 using namespace favrin::tool;
 
@@ -18,6 +19,16 @@ void say(const QString &text)
 bool printLine(const std::string &line)
 {
     return std::fprintf(stdout, "%s\n", line.c_str()) >= 0 && std::fflush(stdout) == 0;
+}
+
+QtMessageHandler previousMessageHandler = nullptr;
+
+/** Qt leaves with status 1 when its display goes, which would say that the user cancelled. */
+void failWithTheDisplay(QtMsgType type, const QMessageLogContext &context, const QString &message)
+{
+    previousMessageHandler(type, context, message);
+    if (message.startsWith(u"The Wayland connection") || message.startsWith(u"The X11 connection broke"))
+        std::_Exit(static_cast<int>(ExitStatus::Failed));
 }
 
 QStringList texts(int count, char **arguments)
@@ -83,6 +94,7 @@ int main(int argc, char *argv[])
         return static_cast<int>(parsed.status);
     }
     const bool isDisplayNeeded = !isOffscreenWanted();
+    previousMessageHandler = qInstallMessageHandler(failWithTheDisplay);
     prepareEnvironment(parsed.options->parent);
     int onlyTheName = 1;
     QGuiApplication application(onlyTheName, argv);
