@@ -104,6 +104,11 @@ FavoriteColorPickerBridge {
                     }
                 }
 
+                TapHandler {
+                    acceptedButtons: Qt.RightButton
+                    onTapped: (eventPoint) => strip.showDeleteCallout(eventPoint.position)
+                }
+
                 Item {
                     x: strip.focusFrame.x
                     y: strip.focusFrame.y
