@@ -62,6 +62,7 @@ void RemoteViewItem::setSession(RemoteViewSession *session)
         });
         connect(session, &RemoteViewSession::frameArrived, this, [this] { m_pointer->serviceDidDraw(); });
         connect(session, &RemoteViewSession::textInputDidChange, this, &RemoteViewItem::textInputDidChange);
+        connect(session, &RemoteViewSession::focusDidLeave, this, &RemoteViewItem::focusDidLeave);
         configureSurface();
         if (hasActiveFocus()) {
             m_keyboard->focusIn();
@@ -267,6 +268,26 @@ void RemoteViewItem::focusInEvent(QFocusEvent *event)
     QQuickItem::focusInEvent(event);
     m_keyboard->focusIn();
     m_clipboard->setActive(true);
+    if (!m_session || (event->reason() != Qt::TabFocusReason && event->reason() != Qt::BacktabFocusReason))
+        return;
+    m_session->server().sendFocusWillEnter(event->reason() == Qt::TabFocusReason ? remote::FocusDirection::Forward
+                                                                                 : remote::FocusDirection::Backward);
+    m_session->flush();
+}
+
+void RemoteViewItem::focusDidLeave(remote::FocusDirection direction)
+{
+    if (!hasActiveFocus())
+        return;
+    const bool forward = direction == remote::FocusDirection::Forward;
+    QQuickItem *next = nextItemInFocusChain(forward);
+    if (next && next != this) {
+        next->forceActiveFocus(forward ? Qt::TabFocusReason : Qt::BacktabFocusReason);
+        return;
+    }
+    // There is nothing else: the focus goes round in the picker.
+    m_session->server().sendFocusWillEnter(direction);
+    m_session->flush();
 }
 
 void RemoteViewItem::focusOutEvent(QFocusEvent *event)

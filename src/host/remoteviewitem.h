@@ -66,6 +66,7 @@ private:
     void hastenFrame();
     void frameWasSwapped();
     void textInputDidChange();
+    void focusDidLeave(remote::FocusDirection direction);
 
     QPointer<RemoteViewSession> m_session;
     QPointer<QQuickWindow> m_window;

@@ -74,6 +74,7 @@ public:
         m_session.m_backgroundEffect = effect;
         Q_EMIT m_session.backgroundEffectDidChange();
     }
+    void focusDidLeave(remote::FocusDirection direction) override { Q_EMIT m_session.focusDidLeave(direction); }
     void textInputDidChange(const server::TextInputState &state) override
     {
         m_session.m_textInput = state;

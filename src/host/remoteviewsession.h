@@ -65,6 +65,7 @@ Q_SIGNALS:
     void colorPickerDidFinish();
     void preferredContentSizeDidChange();
     void backgroundEffectDidChange();
+    void focusDidLeave(remote::FocusDirection direction);
     void textInputDidChange();
     void clipboardOffered(const std::vector<std::string> &mimeTypes);
     void clipboardWanted(const std::string &mimeType, int descriptor);

@@ -28,6 +28,8 @@ enum class TextSizeCategory : std::uint32_t {
     AccessibilityExtraExtraExtraLarge = 11,
 };
 enum class DisplayGamut : std::uint32_t { SRGB = 0, P3 = 1 };
+/** Where the keyboard focus moves: in reading order, as by the Tab key, or against it. */
+enum class FocusDirection : std::uint32_t { Forward = 0, Backward = 1 };
 enum class BackgroundEffect : std::uint32_t { None = 0, ThickMaterial = 1 };
 
 /** What the service knows of its surroundings. */

@@ -12,7 +12,10 @@ Item {
     readonly property real hexRowGap: 25
     readonly property real hexFieldGap: 16
 
-    implicitHeight: blue.y + blue.height + hexRowGap + hex.height
+    readonly property real hexRowTop: blue.y + blue.height + hexRowGap
+    readonly property real hexRowHeight: Math.max(hex.height, spaceButton.height)
+
+    implicitHeight: hexRowTop + hexRowHeight
 
     ColorSlider {
         id: red
@@ -41,6 +44,8 @@ Item {
     }
 
     ColorSpaceButton {
+        id: spaceButton
+
         anchors.verticalCenter: hex.verticalCenter
         anchors.right: hex.left
         anchors.rightMargin: view.hexFieldGap
@@ -52,7 +57,7 @@ Item {
         id: hex
 
         anchors.right: parent.right
-        y: blue.y + blue.height + view.hexRowGap
+        y: view.hexRowTop + (view.hexRowHeight - height) / 2
         width: 100
         colorPickerState: view.colorPickerState
         coordinator: HexFieldCoordinator { colorPickerState: view.colorPickerState }

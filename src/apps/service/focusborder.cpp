@@ -48,15 +48,23 @@ void FocusBorder::enterNow()
 {
     if (!m_entry || !m_window.isActive())
         return;
-    const FocusDirection direction = *std::exchange(m_entry, std::nullopt);
-    if (QQuickItem *element = edge(m_window, direction))
-        element->forceActiveFocus(direction == FocusDirection::Forward ? Qt::TabFocusReason : Qt::BacktabFocusReason);
+    QQuickItem *element = edge(m_window, *m_entry);
+    if (!element)
+        return;
+    // An element that has the focus already would not hear where it comes from.
+    element->setFocus(false);
+    element->forceActiveFocus(*m_entry == FocusDirection::Forward ? Qt::TabFocusReason : Qt::BacktabFocusReason);
 }
 
 bool FocusBorder::eventFilter(QObject *watched, QEvent *event)
 {
-    if (watched != &m_window || event->type() != QEvent::KeyPress)
+    if (watched != &m_window)
         return false;
+    if (event->type() == QEvent::MouseButtonPress || event->type() == QEvent::TouchBegin)
+        m_entry.reset();
+    if (event->type() != QEvent::KeyPress)
+        return false;
+    m_entry.reset();
     const auto way = direction(*static_cast<QKeyEvent *>(event));
     return way && isAtBorder(*way) && m_leave(*way);
 }

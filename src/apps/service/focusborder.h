@@ -34,7 +34,10 @@ private:
 
     QQuickWindow &m_window;
     std::function<bool(remote::FocusDirection)> m_leave;
-    /** Asked for before the window has the keyboard. */
+    /**
+     * How the focus came in, until the user does something: the window learns late, and perhaps only after it lost the
+     * keyboard once more, that it has the keyboard, and forgets meanwhile where the focus came from.
+     */
     std::optional<remote::FocusDirection> m_entry;
 };
 

@@ -63,6 +63,9 @@ const void *RemoteView::requests()
         requests.set_background_effect = [](wl_client *, wl_resource *r, std::uint32_t effect) {
             viewOf(r).backgroundEffectDidChange(effect);
         };
+        requests.focus_did_leave = [](wl_client *, wl_resource *r, std::uint32_t direction) {
+            viewOf(r).focusDidLeave(direction);
+        };
         return requests;
     }();
     return &table;
@@ -137,6 +140,12 @@ void RemoteView::sendPresent()
 {
     m_waiting.present = true;
     settle();
+}
+
+void RemoteView::sendFocusWillEnter(remote::FocusDirection direction)
+{
+    if (canSend())
+        favrin_remote_view_v1_send_focus_will_enter(m_view.get(), static_cast<std::uint32_t>(direction));
 }
 
 void RemoteView::sendColorPickerDidFinish()
@@ -226,6 +235,15 @@ void RemoteView::backgroundEffectDidChange(std::uint32_t effect)
         m_connection.delegate().backgroundEffectDidChange(static_cast<remote::BackgroundEffect>(effect));
     else
         wl_resource_post_error(m_view.get(), FAVRIN_REMOTE_VIEW_V1_ERROR_INVALID_VALUE, "background effect %u", effect);
+}
+
+void RemoteView::focusDidLeave(std::uint32_t direction)
+{
+    if (direction <= FAVRIN_REMOTE_VIEW_V1_FOCUS_DIRECTION_BACKWARD)
+        m_connection.delegate().focusDidLeave(static_cast<remote::FocusDirection>(direction));
+    else
+        wl_resource_post_error(m_view.get(), FAVRIN_REMOTE_VIEW_V1_ERROR_INVALID_VALUE, "focus direction %u",
+                               direction);
 }
 
 bool RemoteView::checkText(const char *text)

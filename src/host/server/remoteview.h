@@ -27,6 +27,8 @@ public:
     void sendSelectedColor(const std::optional<platform::Color> &color, const std::optional<std::string> &colorspace);
     void sendPrepareForDisplay(std::uint32_t serial);
     void sendPresent();
+    /** Not kept for later: a focus that moved on is not missed. */
+    void sendFocusWillEnter(remote::FocusDirection direction);
     void sendColorPickerDidFinish();
     /** Sends what waits, as far as there is room: traits, configuration, color, prepare, present, finish. */
     void settle();
@@ -57,6 +59,7 @@ private:
                               std::uint32_t isVolatile);
     void preferredContentSizeDidChange(double width, double height);
     void backgroundEffectDidChange(std::uint32_t effect);
+    void focusDidLeave(std::uint32_t direction);
     bool checkText(const char *text);
     void warn(const std::string &message);
 

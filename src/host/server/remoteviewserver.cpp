@@ -143,6 +143,11 @@ void RemoteViewServer::sendPresent()
     d->view.sendPresent();
 }
 
+void RemoteViewServer::sendFocusWillEnter(remote::FocusDirection direction)
+{
+    d->view.sendFocusWillEnter(direction);
+}
+
 void RemoteViewServer::sendColorPickerDidFinish()
 {
     d->view.sendColorPickerDidFinish();

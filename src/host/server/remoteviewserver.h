@@ -99,6 +99,8 @@ public:
     /** Points, 0 … remote::limits::largestSize. */
     virtual void preferredContentSizeDidChange(double width, double height) = 0;
     virtual void backgroundEffectDidChange(remote::BackgroundEffect effect) = 0;
+    /** The keyboard focus moved past the picker's last element in that direction. */
+    virtual void focusDidLeave(remote::FocusDirection direction) = 0;
 
     virtual void textInputDidChange(const TextInputState &state) = 0;
     /** The service owns the clipboard and offers these types; empty when it has nothing any more. */
@@ -167,6 +169,8 @@ public:
     void sendSelectedColor(const std::optional<platform::Color> &color, const std::optional<std::string> &colorspace);
     void sendPrepareForDisplay(std::uint32_t serial);
     void sendPresent();
+    /** To be sent after keyboardEnter(). */
+    void sendFocusWillEnter(remote::FocusDirection direction);
     void sendColorPickerDidFinish();
 
     // Input. Positions in points of the surface, fractions allowed; times in milliseconds of any one clock.

@@ -67,6 +67,7 @@ struct RemoteViewConnection::Private : RemoteViewEventsReceiver
         }
     }
     void presentDidArrive() override { delegate.shouldPresent(); }
+    void focusWillEnterDidArrive(FocusDirection direction) override { delegate.focusWillEnter(direction); }
     void colorPickerDidFinishDidArrive() override
     {
         if (auto *controller = delegate.remoteViewController())
@@ -107,6 +108,14 @@ void RemoteViewConnection::sendReady()
     if (!d->view || std::exchange(d->readySent, true))
         return;
     favrin_remote_view_v1_ready(d->view);
+    d->flush();
+}
+
+void RemoteViewConnection::sendFocusDidLeave(FocusDirection direction)
+{
+    if (!d->view)
+        return;
+    favrin_remote_view_v1_focus_did_leave(d->view, static_cast<std::uint32_t>(direction));
     d->flush();
 }
 

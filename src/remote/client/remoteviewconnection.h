@@ -18,6 +18,8 @@ public:
     virtual void traitsDidChange(const Traits &traits) = 0;
     /** The app presents the picker now. */
     virtual void shouldPresent() = 0;
+    /** The keyboard focus moves in from the host's other elements. */
+    virtual void focusWillEnter(FocusDirection direction) = 0;
     /** Called before the host hears of the end, so that what the picker still has to say comes first. */
     virtual void presentationWillEnd() = 0;
     /** The controller that hears the host's messages; null while there is none. */
@@ -46,6 +48,9 @@ public:
 
     /** Tells the host, once, that the picker could be shown at once. */
     void sendReady();
+
+    /** Tells the host that the keyboard focus moved out of the picker. */
+    void sendFocusDidLeave(FocusDirection direction);
 
     void pickerDidSelectColor(const std::optional<platform::Color> &color, const std::optional<std::string> &colorspace,
                               bool isVolatile) override;

@@ -109,6 +109,12 @@ struct RemoteViewEvents::Handlers
         self(data).m_receiver.prepareForDisplayDidArrive(serial);
     }
     static void present(void *data, favrin_remote_view_v1 *) { self(data).m_receiver.presentDidArrive(); }
+    static void focusWillEnter(void *data, favrin_remote_view_v1 *, uint32_t direction)
+    {
+        // A direction that nobody knows comes from the front.
+        const bool backward = direction == FAVRIN_REMOTE_VIEW_V1_FOCUS_DIRECTION_BACKWARD;
+        self(data).m_receiver.focusWillEnterDidArrive(backward ? FocusDirection::Backward : FocusDirection::Forward);
+    }
     static void colorPickerDidFinish(void *data, favrin_remote_view_v1 *)
     {
         self(data).m_receiver.colorPickerDidFinishDidArrive();
@@ -149,6 +155,7 @@ const favrin_remote_view_v1_listener &RemoteViewEvents::listener()
         .set_selected_color = Handlers::setSelectedColor,
         .prepare_for_display = Handlers::prepareForDisplay,
         .present = Handlers::present,
+        .focus_will_enter = Handlers::focusWillEnter,
         .color_picker_did_finish = Handlers::colorPickerDidFinish,
     };
     return listener;

@@ -21,6 +21,7 @@ public:
                                         const std::optional<std::string> &colorspace) = 0;
     virtual void prepareForDisplayDidArrive(std::uint32_t serial) = 0;
     virtual void presentDidArrive() = 0;
+    virtual void focusWillEnterDidArrive(FocusDirection direction) = 0;
     virtual void colorPickerDidFinishDidArrive() = 0;
 };
 

@@ -59,6 +59,10 @@ public:
     {
         calls.push_back("size " + std::to_string(width) + " " + std::to_string(height));
     }
+    void focusDidLeave(favrin::remote::FocusDirection direction) override
+    {
+        calls.push_back("leave " + std::to_string(static_cast<int>(direction)));
+    }
     void backgroundEffectDidChange(favrin::remote::BackgroundEffect effect) override
     {
         calls.push_back("effect " + std::to_string(static_cast<int>(effect)));

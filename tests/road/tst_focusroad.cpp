@@ -1,0 +1,130 @@
+#include "roadhost.h"
+
+using State = FVColorPickerViewController::State;
+
+namespace {
+
+/** Two elements of the app, and between them a container for the picker. */
+class HostWithElements : public RoadHost
+{
+public:
+    explicit HostWithElements(QSize container = QSize(380, 640)) : RoadHost(QSize(900, 700))
+    {
+        before.setActiveFocusOnTab(true);
+        place.setPosition(QPointF(30, 20));
+        place.setSize(container);
+        after.setActiveFocusOnTab(true);
+        window.requestActivate();
+    }
+
+    /** Tab as often as that, each when the one before can be seen to have moved the ring. */
+    void tab(int times, Qt::Key key = Qt::Key_Tab)
+    {
+        for (int time = 0; time < times; ++time) {
+            const QImage ring = window.grabWindow();
+            QTest::keyClick(&window, key, key == Qt::Key_Backtab ? Qt::ShiftModifier : Qt::NoModifier);
+            QTRY_VERIFY(window.grabWindow() != ring);
+        }
+    }
+
+    QQuickItem before = QQuickItem(window.contentItem());
+    QQuickItem place = QQuickItem(window.contentItem());
+    QQuickItem after = QQuickItem(window.contentItem());
+};
+
+/** Eyedropper, tab picker, grid, track and field of the opacity, well, favorites. */
+constexpr int stops = 7;
+
+} // namespace
+
+/** The keyboard focus on its way between the elements of an app and those of the picker. */
+class FocusRoadTest : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void goesThroughAnEmbeddedPicker_data();
+    void goesThroughAnEmbeddedPicker();
+    void entersWhereItComesFrom();
+    void goesRoundWhereThereIsNothingElse();
+    void staysInAPresentedPicker();
+};
+
+void FocusRoadTest::goesThroughAnEmbeddedPicker_data()
+{
+    QTest::addColumn<bool>("forward");
+    QTest::newRow("forward") << true;
+    QTest::newRow("backward") << false;
+}
+
+void FocusRoadTest::goesThroughAnEmbeddedPicker()
+{
+    QFETCH(bool, forward);
+    HostWithElements host;
+    host.picker.embed(&host.place);
+    QTRY_VERIFY(host.isReady());
+    QQuickItem &start = forward ? host.before : host.after;
+    QQuickItem &end = forward ? host.after : host.before;
+    start.forceActiveFocus(Qt::TabFocusReason);
+    const Qt::Key key = forward ? Qt::Key_Tab : Qt::Key_Backtab;
+    host.tab(1, key);
+    QVERIFY(host.picker.view()->hasActiveFocus());
+    host.tab(stops - 1, key);
+    // The last element has it still; one more leaves.
+    QVERIFY(host.picker.view()->hasActiveFocus());
+    host.tab(1, key);
+    QTRY_VERIFY(end.hasActiveFocus());
+    QVERIFY(host.picks.empty());
+}
+
+void FocusRoadTest::entersWhereItComesFrom()
+{
+    HostWithElements host;
+    host.picker.embed(&host.place);
+    QTRY_VERIFY(host.isReady());
+    host.before.forceActiveFocus(Qt::TabFocusReason);
+    host.tab(3);
+    QTest::keyClick(&host.window, Qt::Key_Down);
+    // The third element is the grid, whose keys pick; black, which is selected, is in its topmost row.
+    QTRY_VERIFY(!host.picks.empty());
+    const auto picks = host.picks.size();
+    host.tab(5);
+    QTRY_VERIFY(host.after.hasActiveFocus());
+    host.tab(5, Qt::Key_Backtab);
+    QTest::keyClick(&host.window, Qt::Key_Down);
+    QTRY_VERIFY(host.picks.size() > picks);
+}
+
+void FocusRoadTest::goesRoundWhereThereIsNothingElse()
+{
+    HostWithElements host;
+    host.before.setActiveFocusOnTab(false);
+    host.after.setActiveFocusOnTab(false);
+    host.picker.embed(&host.place);
+    QTRY_VERIFY(host.isReady());
+    // It has the focus from the start. The last element leads to the first, and that further on to the grid.
+    QVERIFY(host.picker.view()->hasActiveFocus());
+    host.tab(stops + 3);
+    QTest::keyClick(&host.window, Qt::Key_Down);
+    QTRY_VERIFY(!host.picks.empty());
+    QVERIFY(host.picker.view()->hasActiveFocus());
+}
+
+void FocusRoadTest::staysInAPresentedPicker()
+{
+    HostWithElements host;
+    host.before.forceActiveFocus();
+    host.picker.present(&host.window);
+    QTRY_VERIFY(host.isReady());
+    // With the close button there is one more.
+    host.tab(stops + 1 + 4);
+    QTest::keyClick(&host.window, Qt::Key_Down);
+    QTRY_VERIFY(!host.picks.empty());
+    QVERIFY(host.picker.view()->hasActiveFocus());
+    host.picker.dismiss();
+    QTRY_COMPARE(host.picker.state(), State::NotRunning);
+    QVERIFY(host.before.hasActiveFocus());
+}
+
+QTEST_MAIN(FocusRoadTest)
+#include "tst_focusroad.moc"

@@ -1,0 +1,121 @@
+#include "pickerwindow.h"
+
+#include "model/axcolordescription.h"
+#include "platform/strings/localizedstring.h"
+#include "platform/strings/translationtable.h"
+#include "support/pseudolocale.h"
+
+#include <QDir>
+#include <QLocale>
+
+using namespace favrin;
+using service::Tab;
+using theme::TextSizeCategory;
+using theme::Theme;
+
+namespace {
+
+/** Everything that can be shown is shown: colors that are suggested and kept, two pages, opacity, a title of a host. */
+void prepare(service::ColorPickerState &state)
+{
+    state.selectedColor.set(model::SomeColor(0.2, 0.4, 0.9, 0.5, model::SomeColor::ColorSpace::displayP3));
+    state.title.set("[title]");
+    state.allowsNoColor.set(true);
+}
+
+std::vector<model::SomeColor> colors(int count)
+{
+    std::vector<model::SomeColor> colors;
+    for (int level = 0; level < count; ++level)
+        colors.emplace_back(level / 30.0, 0.5, 0.5, 1.0, model::SomeColor::ColorSpace::sRGB);
+    return colors;
+}
+
+} // namespace
+
+/** The whole picker in other languages. */
+class PickerLanguagesTest : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void initTestCase();
+    void cleanup();
+    void everyTextIsTranslatedAndFits_data();
+    void everyTextIsTranslatedAndFits();
+    void everyLanguageFits_data();
+    void everyLanguageFits();
+};
+
+void PickerLanguagesTest::initTestCase()
+{
+    QAccessible::setActive(true);
+    // Names of colors are spoken at once.
+    model::ColorNamingReadiness::process().becomeReady();
+}
+
+void PickerLanguagesTest::cleanup()
+{
+    platform::setStringTable({});
+    QLocale::setDefault(QLocale::c());
+    Theme::instance().setTextSizeCategory(TextSizeCategory::Large);
+    Theme::instance().setLayoutDirection(Qt::LeftToRight);
+}
+
+void PickerLanguagesTest::everyTextIsTranslatedAndFits_data()
+{
+    QTest::addColumn<QSize>("size");
+    QTest::addColumn<TextSizeCategory>("textSize");
+    for (const TextSizeCategory textSize :
+         {TextSizeCategory::ExtraSmall, TextSizeCategory::Large, TextSizeCategory::AccessibilityExtraExtraExtraLarge}) {
+        QTest::addRow("portrait, text size %d", static_cast<int>(textSize)) << QSize(360, 700) << textSize;
+        QTest::addRow("landscape, text size %d", static_cast<int>(textSize)) << QSize(568, 420) << textSize;
+    }
+}
+
+void PickerLanguagesTest::everyTextIsTranslatedAndFits()
+{
+    QFETCH(QSize, size);
+    QFETCH(TextSizeCategory, textSize);
+    platform::installTranslations(u"en-XA");
+    Theme::instance().setTextSizeCategory(textSize);
+    PickerWindow picker(size, colors(30), prepare);
+    picker.state.useLandscapeLayout.set(size.width() > 500);
+    QVERIFY(picker.isReady());
+    for (const Tab tab : service::allTabs) {
+        picker.state.selectedTab.set(tab);
+        QCOMPARE(untranslatedTexts(*picker.view).join(u'\n'), QString());
+        QCOMPARE(clippedTexts(*picker.view).join(u'\n'), QString());
+        QCOMPARE(untranslatedSpeech(*picker.view).join(u'\n'), QString());
+    }
+}
+
+void PickerLanguagesTest::everyLanguageFits_data()
+{
+    QTest::addColumn<QString>("language");
+    const QStringList tables = QDir(QStringLiteral(":/favrin/translations")).entryList({QStringLiteral("*.qm")});
+    QVERIFY(tables.size() >= 30);
+    for (const QString &table : tables) {
+        const QString language = table.section(u'_', 1).chopped(3);
+        QTest::newRow(qPrintable(language)) << language;
+    }
+}
+
+void PickerLanguagesTest::everyLanguageFits()
+{
+    QFETCH(QString, language);
+    const QLocale locale(language);
+    QLocale::setDefault(locale);
+    platform::installTranslations(language);
+    Theme::instance().setLayoutDirection(locale.textDirection());
+    Theme::instance().setTextSizeCategory(TextSizeCategory::ExtraExtraExtraLarge);
+    PickerWindow picker(QSize(360, 700), {}, prepare);
+    QVERIFY(picker.isReady());
+    for (const Tab tab : service::allTabs) {
+        picker.state.selectedTab.set(tab);
+        QCOMPARE(clippedTexts(*picker.view).join(u'\n'), QString());
+    }
+}
+
+QTEST_MAIN(PickerLanguagesTest)
+#include "tst_pickerlanguages.moc"
