@@ -18,6 +18,10 @@ if(FAVRIN_SANITIZERS)
         -fsanitize=${FAVRIN_SANITIZERS} -fno-omit-frame-pointer -fno-sanitize-recover=all)
     target_link_options(favrin_build_options INTERFACE -fsanitize=${FAVRIN_SANITIZERS})
 endif()
+if(FAVRIN_BUILD_FUZZERS)
+    # Everything tells the fuzzer which way an input took.
+    target_compile_options(favrin_build_options INTERFACE -fsanitize=fuzzer-no-link)
+endif()
 
 # Include paths start at src/, so that an include names the folder it comes from.
 target_include_directories(favrin_build_options INTERFACE "${PROJECT_SOURCE_DIR}/src")

@@ -73,8 +73,9 @@ std::optional<std::u16string> NumberFormatter::string(double number) const
     if (!m_format->decimal || !std::isfinite(number))
         return std::nullopt;
     icu::UnicodeString text;
-    // No minus sign before a zero.
-    m_format->decimal->format(number == 0.0 ? 0.0 : number, text);
+    // No minus sign before a zero, nor before what is rounded to one.
+    const bool isZero = std::nearbyint(number * m_format->decimal->getMultiplier()) == 0.0;
+    m_format->decimal->format(isZero ? 0.0 : number, text);
     return plain(text);
 }
 
