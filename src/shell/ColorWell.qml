@@ -11,6 +11,7 @@ ColorWellBridge {
             menu.openAt(well, Qt.rect(0, 0, width, height));
     }
 
+    Accessible.role: Accessible.Graphic
     Keys.onMenuPressed: openMenu()
 
     TapHandler {

@@ -98,6 +98,46 @@ def main():
             os.killpg(launcher.pid, signal.SIGKILL)
 
 
+def shown(application, role, name):
+    return [node for node in nodes(application, role) if node.get_name() == name and has_state(node, Atspi.StateType.SHOWING)]
+
+
+def check_names(application, where):
+    nameless = [node.get_role_name() for node in walk(application)
+                if has_state(node, Atspi.StateType.FOCUSABLE) and not node.get_name()]
+    check(not nameless, f"{where}: everything that takes the focus has a name {nameless}")
+    sliders = [node for node in nodes(application, Atspi.Role.SLIDER) if has_state(node, Atspi.StateType.SHOWING)]
+    wrong = [node.get_name() for node in sliders
+             if not node.get_minimum_value() <= node.get_current_value() <= node.get_maximum_value()]
+    check(sliders and not wrong, f"{where}: {len(sliders)} sliders have values within their bounds {wrong}")
+
+
+def walk_through_the_tabs(application, host):
+    """Every tab by its name; black is selected and opaque."""
+    landmarks = {
+        "Spectrum": (Atspi.Role.COLOR_CHOOSER, "Color Spectrum"),
+        "Sliders": (Atspi.Role.SLIDER, "Green"),
+        "Grid": (Atspi.Role.LIST, "Grid"),
+    }
+    for name, landmark in landmarks.items():
+        tabs = shown(application, Atspi.Role.PAGE_TAB, name)
+        check(len(tabs) == 1, f"there is one tab {name}")
+        press(tabs[0])
+        found = wait_for(f"{name}: {landmark[1]} is shown", lambda landmark=landmark: shown(application, *landmark))
+        wait_for(f"{name} is the checked tab", lambda tab=tabs[0]: has_state(tab, Atspi.StateType.CHECKED))
+        check_names(application, name)
+        if name == "Sliders":
+            found[0].set_current_value(255)
+            wait_for("the host hears of a changed slider", lambda: host.said("pick 0 1 0 1 kTQColorSpaceSRGB final"))
+            print("PASS: a slider that is set is a final pick")
+
+    wells = shown(application, Atspi.Role.IMAGE, "Selected Color")
+    check(len(wells) == 1, "there is one well")
+    wait_for("the well says which color it shows", lambda: "green" in wells[0].get_description())
+    favorites = shown(application, Atspi.Role.LIST, "Favorites")
+    check(len(favorites) == 1 and all(node.get_name() for node in walk(favorites[0])), "the favorites have names")
+
+
 def read_and_use(host):
     wait_for("the host shows the picker", lambda: host.said("ready"))
     application = wait_for("the picker is on the accessibility bus", service)
@@ -119,6 +159,8 @@ def read_and_use(host):
     print("PASS: a pressed swatch is a final pick")
     wait_for("the pressed swatch is selected", lambda: has_state(swatches[11], Atspi.StateType.SELECTED))
     check(not has_state(swatches[0], Atspi.StateType.SELECTED), "the swatch before is not selected any more")
+
+    walk_through_the_tabs(application, host)
 
     close = [node for node in nodes(application, Atspi.Role.PUSH_BUTTON) if node.get_name() == "Close"]
     check(len(close) == 1, "there is one close button")
