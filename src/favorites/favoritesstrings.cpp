@@ -1,8 +1,14 @@
 #include "favorites/favoritesstrings.h"
 
 #include "platform/strings/localizedstring.h"
+#include "theme/theme.h"
 
 namespace favrin::favorites {
+
+FavoritesStrings::FavoritesStrings(QObject *parent) : QObject(parent)
+{
+    connect(&theme::Theme::instance(), &theme::Theme::localeChanged, this, &FavoritesStrings::localeChanged);
+}
 
 QString FavoritesStrings::favorites()
 {

@@ -12,12 +12,17 @@ class FavoritesStrings : public QObject
     Q_OBJECT
     QML_ELEMENT
     QML_SINGLETON
-    Q_PROPERTY(QString favorites READ favorites CONSTANT FINAL)
-    Q_PROPERTY(QString deleteCommand READ deleteCommand CONSTANT FINAL)
+    Q_PROPERTY(QString favorites READ favorites NOTIFY localeChanged FINAL)
+    Q_PROPERTY(QString deleteCommand READ deleteCommand NOTIFY localeChanged FINAL)
 
 public:
+    explicit FavoritesStrings(QObject *parent = nullptr);
+
     static QString favorites();
     static QString deleteCommand();
+
+Q_SIGNALS:
+    void localeChanged();
 };
 
 } // namespace favrin::favorites

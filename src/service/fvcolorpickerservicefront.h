@@ -35,6 +35,8 @@ public:
     ViewController *childViewController() const { return m_childViewController; }
     /** The last record that the host sent. */
     const std::optional<remote::Configuration> &configuration() const { return m_configuration; }
+    /** To be called when the texts of the process are those of another language. */
+    void localeDidChange();
     /** Height at the bottom that is left free for the host's keyboard. */
     double keyboardSpace() const;
     /** None at first; the host is told of every change. */

@@ -29,6 +29,13 @@ void FVColorPickerServiceFront::setConfiguration(const remote::Configuration &co
     layoutNow();
 }
 
+void FVColorPickerServiceFront::localeDidChange()
+{
+    // The default title is a text of ours.
+    if (const auto configuration = m_configuration)
+        setConfiguration(*configuration);
+}
+
 void FVColorPickerServiceFront::prepareForDisplay(std::function<void()> completion)
 {
     auto *child = loadedChild();

@@ -1,12 +1,18 @@
 #include "shell/shellstrings.h"
 
 #include "platform/strings/localizedstring.h"
+#include "theme/theme.h"
 
 #include <QLocale>
 
 namespace favrin::shell {
 
 using platform::localizedString;
+
+ShellStrings::ShellStrings(QObject *parent) : QObject(parent)
+{
+    connect(&theme::Theme::instance(), &theme::Theme::localeChanged, this, &ShellStrings::localeChanged);
+}
 
 QString ShellStrings::close()
 {

@@ -12,13 +12,15 @@ class ShellStrings : public QObject
     Q_OBJECT
     QML_ELEMENT
     QML_SINGLETON
-    Q_PROPERTY(QString close READ close CONSTANT FINAL)
-    Q_PROPERTY(QString colorPickerType READ colorPickerType CONSTANT FINAL)
-    Q_PROPERTY(QString copy READ copy CONSTANT FINAL)
-    Q_PROPERTY(QString eyedropper READ eyedropper CONSTANT FINAL)
-    Q_PROPERTY(QString eyedropperAlternatives READ eyedropperAlternatives CONSTANT FINAL)
+    Q_PROPERTY(QString close READ close NOTIFY localeChanged FINAL)
+    Q_PROPERTY(QString colorPickerType READ colorPickerType NOTIFY localeChanged FINAL)
+    Q_PROPERTY(QString copy READ copy NOTIFY localeChanged FINAL)
+    Q_PROPERTY(QString eyedropper READ eyedropper NOTIFY localeChanged FINAL)
+    Q_PROPERTY(QString eyedropperAlternatives READ eyedropperAlternatives NOTIFY localeChanged FINAL)
 
 public:
+    explicit ShellStrings(QObject *parent = nullptr);
+
     static QString close();
     static QString colorPickerType();
     static QString copy();
@@ -26,6 +28,9 @@ public:
     /** The other words by which somebody who speaks to the computer may mean the eyedropper. */
     static QString eyedropperAlternatives();
     static QString selectedColor();
+
+Q_SIGNALS:
+    void localeChanged();
 };
 
 } // namespace favrin::shell

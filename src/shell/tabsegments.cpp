@@ -1,11 +1,18 @@
 #include "shell/tabsegments.h"
 
+#include "theme/theme.h"
+
 #include <algorithm>
 
 namespace favrin::shell {
 
 using service::ColorPickerState;
 using service::Tab;
+
+TabSegments::TabSegments(QObject *parent) : QObject(parent)
+{
+    connect(&theme::Theme::instance(), &theme::Theme::localeChanged, this, &TabSegments::titlesChanged);
+}
 
 void TabSegments::setColorPickerState(ColorPickerState *state)
 {

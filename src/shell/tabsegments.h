@@ -14,11 +14,11 @@ class TabSegments : public QObject
     QML_ELEMENT
     Q_PROPERTY(favrin::service::ColorPickerState *colorPickerState READ colorPickerState WRITE setColorPickerState
                    NOTIFY colorPickerStateChanged REQUIRED FINAL)
-    Q_PROPERTY(QStringList titles READ titles CONSTANT FINAL)
+    Q_PROPERTY(QStringList titles READ titles NOTIFY titlesChanged FINAL)
     Q_PROPERTY(int current READ current WRITE setCurrent NOTIFY currentChanged FINAL)
 
 public:
-    using QObject::QObject;
+    explicit TabSegments(QObject *parent = nullptr);
 
     service::ColorPickerState *colorPickerState() const { return m_state; }
     void setColorPickerState(service::ColorPickerState *state);
@@ -31,6 +31,7 @@ public:
 
 Q_SIGNALS:
     void colorPickerStateChanged();
+    void titlesChanged();
     void currentChanged();
 
 private:

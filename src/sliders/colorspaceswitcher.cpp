@@ -2,6 +2,7 @@
 
 #include "platform/strings/localizedstring.h"
 #include "sliders/colorspacelabel.h"
+#include "theme/theme.h"
 
 #include <algorithm>
 
@@ -10,7 +11,13 @@ namespace favrin::sliders {
 using model::SomeColor;
 using service::ColorPickerState;
 
-ColorSpaceSwitcher::ColorSpaceSwitcher(QObject *parent) : QObject(parent) {}
+ColorSpaceSwitcher::ColorSpaceSwitcher(QObject *parent) : QObject(parent)
+{
+    connect(&theme::Theme::instance(), &theme::Theme::localeChanged, this, [this] {
+        Q_EMIT namesChanged();
+        Q_EMIT currentChanged();
+    });
+}
 
 void ColorSpaceSwitcher::setColorPickerState(ColorPickerState *state)
 {

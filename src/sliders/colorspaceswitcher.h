@@ -15,9 +15,9 @@ class ColorSpaceSwitcher : public QObject
     Q_PROPERTY(favrin::service::ColorPickerState *colorPickerState READ colorPickerState WRITE setColorPickerState
                    NOTIFY colorPickerStateChanged REQUIRED FINAL)
     Q_PROPERTY(QString label READ label NOTIFY currentChanged FINAL)
-    Q_PROPERTY(QString menuTitle READ menuTitle CONSTANT FINAL)
+    Q_PROPERTY(QString menuTitle READ menuTitle NOTIFY namesChanged FINAL)
     /** The names of all spaces, in the order in which they are offered. */
-    Q_PROPERTY(QStringList names READ names CONSTANT FINAL)
+    Q_PROPERTY(QStringList names READ names NOTIFY namesChanged FINAL)
     Q_PROPERTY(int current READ current NOTIFY currentChanged FINAL)
 
 public:
@@ -35,6 +35,7 @@ public:
 
 Q_SIGNALS:
     void colorPickerStateChanged();
+    void namesChanged();
     void currentChanged();
 
 private:

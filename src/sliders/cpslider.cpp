@@ -21,6 +21,7 @@ CPSlider::CPSlider(QQuickItem *parent)
     setImplicitHeight(trackHeight);
     setActiveFocusOnTab(true);
     connect(&Theme::instance(), &Theme::layoutDirectionChanged, this, &CPSlider::thumbCenterChanged);
+    connect(&Theme::instance(), &Theme::localeChanged, this, &CPSlider::componentChanged);
 }
 
 void CPSlider::setColorPickerState(ColorPickerState *state)

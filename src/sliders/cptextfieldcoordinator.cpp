@@ -3,6 +3,7 @@
 #include "platform/strings/localizedstring.h"
 #include "sliders/caretconfinement.h"
 #include "sliders/editquestion.h"
+#include "theme/theme.h"
 
 #include <QGuiApplication>
 #include <QInputMethod>
@@ -29,6 +30,10 @@ CPTextFieldCoordinator::CPTextFieldCoordinator(QObject *parent)
 {
     connect(QGuiApplication::inputMethod(), &QInputMethod::visibleChanged, this,
             &CPTextFieldCoordinator::keyboardVisibleChanged);
+    connect(&theme::Theme::instance(), &theme::Theme::localeChanged, this, [this] {
+        update();
+        Q_EMIT nameChanged();
+    });
 }
 
 void CPTextFieldCoordinator::setColorPickerState(ColorPickerState *state)

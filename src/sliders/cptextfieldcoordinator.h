@@ -32,7 +32,7 @@ class CPTextFieldCoordinator : public QObject
     Q_PROPERTY(QQuickItem *viewport READ viewport NOTIFY fieldChanged FINAL)
     /** The on-screen keyboard is here. */
     Q_PROPERTY(bool isKeyboardVisible READ isKeyboardVisible NOTIFY keyboardVisibleChanged FINAL)
-    Q_PROPERTY(QString doneLabel READ doneLabel CONSTANT FINAL)
+    Q_PROPERTY(QString doneLabel READ doneLabel NOTIFY nameChanged FINAL)
     /** What assistive technologies call the field. */
     Q_PROPERTY(QString name READ name NOTIFY nameChanged FINAL)
 

@@ -62,6 +62,8 @@ public:
     void setLayoutDirection(Qt::LayoutDirection direction);
     bool reduceMotion() const { return m_reduceMotion; }
     void setReduceMotion(bool reduce);
+    /** To be called after the language or the formats of the process became others. */
+    void noteLocaleChanged() { Q_EMIT localeChanged(); }
 
     QColor label() const { return m_colors.label; }
     QColor secondaryLabel() const { return m_colors.secondaryLabel; }
@@ -91,6 +93,8 @@ Q_SIGNALS:
     void textSizeCategoryChanged();
     void layoutDirectionChanged();
     void reduceMotionChanged();
+    /** Texts and numbers are to be asked for again. */
+    void localeChanged();
 
 private:
     Theme();

@@ -45,6 +45,7 @@ private Q_SLOTS:
     void everyTextIsTranslatedAndFits();
     void everyLanguageFits_data();
     void everyLanguageFits();
+    void anotherLanguageTakesEffectAtOnce();
 };
 
 void PickerLanguagesTest::initTestCase()
@@ -115,6 +116,28 @@ void PickerLanguagesTest::everyLanguageFits()
         picker.state.selectedTab.set(tab);
         QCOMPARE(clippedTexts(*picker.view).join(u'\n'), QString());
     }
+}
+
+void PickerLanguagesTest::anotherLanguageTakesEffectAtOnce()
+{
+    platform::installTranslations(u"de");
+    PickerWindow picker(QSize(360, 700), {}, prepare);
+    picker.state.selectedTab.set(Tab::sliders);
+    QVERIFY(picker.isReady());
+    QVERIFY(picker.item(QStringLiteral("Rot")));
+    const auto field = [&](const QString &name) { return picker.editableItem(name)->property("text").toString(); };
+    QCOMPARE(field(QStringLiteral("Blau")), QStringLiteral("230"));
+
+    QLocale::setDefault(QLocale(QStringLiteral("ar-EG")));
+    platform::installTranslations(u"ar-EG");
+    Theme::instance().noteLocaleChanged();
+    for (const char *left : {"Rot", "Blau", "Deckkraft", "Schließen", "Raster", "Favoriten"})
+        QVERIFY2(!picker.item(QString::fromUtf8(left)), left);
+    for (const char *key : {"Red", "Blue", "Opacity", "Close", "Grid", "Favorites", "Selected Color"})
+        QVERIFY2(picker.item(QString::fromStdString(platform::localizedString(key, ""))), key);
+    // The formats of numbers are those of the process's first use.
+    QCOMPARE(field(QString::fromStdString(platform::localizedString("Blue", ""))), QStringLiteral("230"));
+    QVERIFY(picker.state.selectedColor().has_value());
 }
 
 QTEST_MAIN(PickerLanguagesTest)

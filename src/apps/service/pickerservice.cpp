@@ -93,6 +93,9 @@ void PickerService::applySurroundings(const remote::Traits &traits)
         QLocale::setDefault(name.isEmpty() ? QLocale::system() : QLocale(name));
         // By the name itself: what the library knows no numbers and dates for may still have a translation.
         platform::installTranslations(name.isEmpty() ? QLocale().bcp47Name() : name);
+        theme::Theme::instance().noteLocaleChanged();
+        if (m_front)
+            m_front->localeDidChange();
     }
     const auto direction =
         traits.layoutDirection == remote::LayoutDirection::RightToLeft ? Qt::RightToLeft : Qt::LeftToRight;
