@@ -18,6 +18,7 @@
 #include <QTimer>
 
 #include <algorithm>
+#include <array>
 #include <cstdio>
 #include <functional>
 #include <vector>
@@ -106,9 +107,7 @@ public:
     {
         if (ahead) {
             FVColorPickerViewController::startServiceAhead();
-            QEventLoop rest;
-            QTimer::singleShot(400, &rest, &QEventLoop::quit);
-            rest.exec();
+            rest(400);
         }
         QElapsedTimer clock;
         clock.start();
@@ -127,19 +126,34 @@ public:
         return waitFor([this] { return m_picker.state() == State::NotRunning; });
     }
 
-    bool drag(Samples &messages, Samples &frames)
+    /** Shows a tab by its segment. */
+    void choose(int tab)
     {
-        const auto origin = m_picker.view()->mapToScene(QPointF(42, 129));
-        send(QEvent::MouseButtonPress, origin);
+        const auto *view = m_picker.view();
+        const auto segment = view->mapToScene(QPointF(padding + (tab + 0.5) / 3 * (view->width() - 2 * padding), 71));
+        send(QEvent::MouseButtonPress, segment);
+        send(QEvent::MouseButtonRelease, segment);
+        rest(300);
+    }
+
+    /** @param place of a step's number: fractions of the tab's width and height, never the same twice in a row */
+    bool drag(Samples &messages, Samples &frames, const std::function<QPointF(int)> &place)
+    {
+        const auto *view = m_picker.view();
+        const double width = (view->width() - 2 * padding - 18) / 2;
+        const QPointF origin = view->mapToScene(QPointF(padding, 103));
+        const auto position = [&](int step) {
+            return origin + QPointF(place(step).x() * width, place(step).y() * width / 1.2);
+        };
+        send(QEvent::MouseButtonPress, position(0));
         for (int step = 1; step <= dragSteps; ++step) {
-            settle();
-            // Always another swatch than the one before.
-            const QPointF position = origin + QPointF(44 * (step % 12), 44 * ((step / 12) % 10));
+            // Nothing of the step before is on its way any more.
+            rest(20);
             const int picks = m_picks;
             const int shown = m_frames;
             QElapsedTimer clock;
             clock.start();
-            send(QEvent::MouseMove, position);
+            send(QEvent::MouseMove, position(step));
             if (!waitFor([&] { return m_picks > picks; }))
                 return false;
             messages.values.push_back(milliseconds(clock));
@@ -147,7 +161,8 @@ public:
                 return false;
             frames.values.push_back(milliseconds(clock));
         }
-        send(QEvent::MouseButtonRelease, origin);
+        send(QEvent::MouseButtonRelease, position(dragSteps));
+        rest(20);
         return true;
     }
 
@@ -166,19 +181,46 @@ private:
         QMouseEvent event(type, position, position, button, held, {});
         QCoreApplication::sendEvent(&m_window, &event);
     }
-    /** Nothing of the step before is on its way any more. */
-    void settle()
+    static void rest(int duration)
     {
-        QEventLoop rest;
-        QTimer::singleShot(20, &rest, &QEventLoop::quit);
-        rest.exec();
+        QEventLoop loop;
+        QTimer::singleShot(duration, &loop, &QEventLoop::quit);
+        loop.exec();
     }
+
+    /** On either side of what the picker shows. */
+    static constexpr double padding = 20;
 
     QQuickWindow m_window;
     FVColorPickerViewController m_picker;
     int m_frames = 0;
     int m_framesAtReady = 0;
     int m_picks = 0;
+};
+
+QPointF swatch(int step)
+{
+    return {(step % 12 + 0.5) / 12, (step / 12 % 10 + 0.5) / 10};
+}
+
+QPointF fieldPlace(int step)
+{
+    return {0.05 + 0.9 * (step * 7 % 101) / 101, 0.05 + 0.9 * (step * 13 % 97) / 97};
+}
+
+/** On the red track, the first row of its tab. */
+QPointF trackPlace(int step)
+{
+    return {0.1 + 0.45 * (step * 7 % 101) / 101, 0.19};
+}
+
+/** What a drag in a tab costs. */
+struct Drags
+{
+    int tab;
+    QPointF (*place)(int step);
+    Samples message;
+    Samples frame;
 };
 
 } // namespace
@@ -195,21 +237,39 @@ int main(int argc, char *argv[])
 
     Samples cold{"present to first frame, cold", "ms"};
     Samples ahead{"present to first frame, started ahead", "ms"};
-    Samples message{"drag: event to pick message", "ms"};
-    Samples frame{"drag: event to changed frame", "ms"};
+    std::array<Drags, 3> drags = {{
+        {0, swatch, {"grid drag: event to pick message", "ms"}, {"grid drag: event to changed frame", "ms"}},
+        {1,
+         fieldPlace,
+         {"spectrum drag: event to pick message", "ms"},
+         {"spectrum drag: event to changed frame", "ms"}},
+        {2,
+         trackPlace,
+         {"red slider drag: event to pick message", "ms"},
+         {"red slider drag: event to changed frame", "ms"}},
+    }};
     Samples memory{"service: proportional memory", "MB"};
     Samples peak{"service: peak resident memory", "MB"};
     Bench bench;
     for (int round = 0; round < rounds; ++round) {
         // In turns, so that a busy moment of the machine meets both.
-        if (!bench.present(cold, false) || (round == 0 && !bench.drag(message, frame)))
+        if (!bench.present(cold, false))
             return 1;
         bench.memory(memory, peak);
         if (!bench.finish() || !bench.present(ahead, true) || !bench.finish())
             return 1;
     }
+    if (!bench.present(cold, false))
+        return 1;
+    std::vector<Samples *> all = {&cold, &ahead, &memory, &peak};
+    for (auto &[tab, place, message, frame] : drags) {
+        bench.choose(tab);
+        if (!bench.drag(message, frame, place))
+            return 1;
+        all.insert(all.end(), {&message, &frame});
+    }
     QJsonObject report;
-    for (auto *samples : {&cold, &ahead, &message, &frame, &memory, &peak})
+    for (auto *samples : all)
         report[QLatin1String(samples->name)] = samples->report();
     std::printf("%s\n", QJsonDocument(report).toJson(QJsonDocument::Compact).constData());
     return 0;
