@@ -173,8 +173,11 @@ void TabsRoadTest::theTabThatWasLeftIsShownAgain()
     host.picker.setSelectedColor(FVColor(0.75, 0.5, 0.25));
     host.picker.present(&host.window);
     QTRY_VERIFY(host.isReady());
-    for (const int tab : tabs)
+    for (const int tab : tabs) {
         host.click(host.tabSegment(tab));
+        // Beside its title the segment is white once its tab is shown.
+        QTRY_COMPARE(host.window.grabWindow().pixel(host.tabSegment(tab) + QPoint(50, 0)), 0xffffffff);
+    }
     QSignalSpy finished(&host.picker, &FVColorPickerViewController::colorPickerDidFinish);
     host.picker.dismiss();
     QTRY_COMPARE(finished.size(), 1);
