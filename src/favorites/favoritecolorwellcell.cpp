@@ -4,12 +4,26 @@
 #include "model/somecolor.h"
 #include "platform/shapes/shapeview.h"
 #include "service/displaycolor.h"
+#include "theme/theme.h"
 
 #include <QPainter>
 
 namespace favrin::favorites {
 
 using service::DisplayColor;
+
+namespace {
+
+/** Black on black, or white on white, can be told from the background. */
+void paintEdge(QPainter &painter, const QRectF &bounds, double devicePixelRatio)
+{
+    painter.setPen(QPen(theme::Theme::instance().separator(), devicePixelRatio));
+    painter.setBrush(Qt::NoBrush);
+    const double inset = devicePixelRatio / 2.0;
+    painter.drawEllipse(bounds.adjusted(inset, inset, -inset, -inset));
+}
+
+} // namespace
 
 QPainterPath blackHalf(const QRectF &bounds)
 {
@@ -49,6 +63,8 @@ void FavoriteColorWellCell::paint(QPainter &painter, QSize size, double devicePi
     platform::ShapeView{blackHalf(bounds), display.interfaceColor(Qt::black)}.draw(painter);
     painter.fillRect(bounds, color);
     platform::ShapeView{circularMask(bounds, isSelected(), devicePixelRatio)}.mask(painter, bounds);
+    if (theme::Theme::instance().increaseContrast())
+        paintEdge(painter, bounds, devicePixelRatio);
 }
 
 } // namespace favrin::favorites

@@ -20,7 +20,9 @@ constexpr double arrowInset = 28;
 QSizeF fitted(QSizeF preferred, QSizeF available)
 {
     const QSizeF wanted = preferred.isEmpty() ? usualSize : preferred;
-    return wanted.boundedTo(available).expandedTo(QSizeF(1, 1));
+    // Whole points, of which nothing is cut off: the surface's pixels then fall on the window's.
+    const QSizeF whole(std::ceil(wanted.width()), std::ceil(wanted.height()));
+    return whole.boundedTo(available).expandedTo(QSizeF(1, 1));
 }
 
 PresentationLayout sheet(QSizeF window, QSizeF preferred)
@@ -37,7 +39,6 @@ PresentationLayout sheet(QSizeF window, QSizeF preferred)
 PresentationLayout card(QSizeF window, QSizeF preferred)
 {
     const QSizeF size = fitted(preferred, window - QSizeF(2 * margin, 2 * margin));
-    // Whole points: the surface's pixels then fall on the window's.
     const QPointF origin(std::floor((window.width() - size.width()) / 2),
                          std::floor((window.height() - size.height()) / 2));
     return {.panel = QRectF(origin, size),
