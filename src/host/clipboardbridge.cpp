@@ -1,8 +1,10 @@
 #include "host/clipboardbridge.h"
 
 #include "host/remoteviewsession.h"
+#include "remote/clipboardtypes.h"
 
 #include <QClipboard>
+#include <QColor>
 #include <QGuiApplication>
 #include <QMimeData>
 #include <QSocketNotifier>
@@ -11,6 +13,7 @@
 #include <array>
 #include <cerrno>
 #include <csignal>
+#include <cstring>
 #include <memory>
 #include <utility>
 
@@ -24,6 +27,7 @@ namespace {
 
 constexpr int mostTypes = 8;
 constexpr qsizetype mostBytes = 64 * 1024;
+constexpr QLatin1String desktopColorType("application/x-color");
 /** A reader that does not read for this long gets no more. */
 constexpr int writePatienceMilliseconds = 2000;
 
@@ -49,6 +53,15 @@ private:
     sigset_t m_pipe;
     sigset_t m_before;
 };
+
+QColor colorFromBytes(const QByteArray &bytes)
+{
+    std::array<quint16, 4> components = {};
+    if (bytes.size() != static_cast<qsizetype>(sizeof components))
+        return {};
+    std::memcpy(components.data(), bytes.constData(), sizeof components);
+    return QColor(QRgba64::fromRgba64(components[0], components[1], components[2], components[3]));
+}
 
 /** Runs on a pool thread: the reader may be slow. Closes the descriptor. */
 void writeAll(const QByteArray &data, int descriptor)
@@ -109,12 +122,23 @@ private:
             return;
         }
         if (count == 0)
-            m_data->setData(QString::fromStdString(m_types[m_index]), m_bytes);
+            take(QString::fromStdString(m_types[m_index]));
         // The notifier is what called; it goes in a later turn.
         m_notifier.release()->deleteLater();
         closeDescriptor();
         ++m_index;
         next();
+    }
+
+    void take(const QString &type)
+    {
+        // The toolkit knows a color only as such, and makes the desktop's bytes of it itself.
+        if (type == QLatin1String(remote::colorClipboardType)) {
+            if (const QColor color = colorFromBytes(m_bytes); color.isValid())
+                m_data->setColorData(color);
+        } else if (type != desktopColorType) {
+            m_data->setData(type, m_bytes);
+        }
     }
 
     void closeDescriptor()

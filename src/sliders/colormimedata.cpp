@@ -1,8 +1,11 @@
 #include "sliders/colormimedata.h"
 
+#include "remote/clipboardtypes.h"
+
 #include <QColor>
 
 #include <algorithm>
+#include <array>
 #include <cmath>
 
 namespace favrin::sliders {
@@ -20,8 +23,10 @@ std::unique_ptr<QMimeData> colorMimeData(const model::SomeColor &color, const QS
     const auto sRGB = color.inSRGB();
     auto data = std::make_unique<QMimeData>();
     data->setText(text);
-    data->setColorData(
-        QColor::fromRgba64(sixteenBits(sRGB.r), sixteenBits(sRGB.g), sixteenBits(sRGB.b), sixteenBits(sRGB.a)));
+    const std::array components = {sixteenBits(sRGB.r), sixteenBits(sRGB.g), sixteenBits(sRGB.b), sixteenBits(sRGB.a)};
+    data->setColorData(QColor::fromRgba64(components[0], components[1], components[2], components[3]));
+    data->setData(QLatin1String(remote::colorClipboardType),
+                  QByteArray(reinterpret_cast<const char *>(components.data()), sizeof components));
     return data;
 }
 
