@@ -124,7 +124,7 @@ FavoriteColorPickerBridge {
         }
     }
 
-    CalloutMenu {
+    CalloutLoader {
         id: menu
 
         command: FavoritesStrings.deleteCommand

@@ -23,7 +23,7 @@ ColorWellBridge {
         onTapped: well.openMenu()
     }
 
-    CalloutMenu {
+    CalloutLoader {
         id: menu
 
         command: ShellStrings.copy
