@@ -42,6 +42,11 @@ FVColorPickerViewController::Private::Private(FVColorPickerViewController &contr
             return;
         Q_EMIT self->wantsMaterialChanged();
     });
+    QObject::connect(picker.get(), &Picker::respondingChanged, self, [this, self](bool responds) {
+        if (std::exchange(responding, responds) == responds)
+            return;
+        Q_EMIT self->respondingChanged();
+    });
     QObject::connect(picker.get(), &Picker::surroundingsChanged, self, [self] {
         Q_EMIT self->hostWindowSizeChanged();
         Q_EMIT self->keyboardSpaceChanged();
@@ -78,6 +83,11 @@ QSizeF FVColorPickerViewController::preferredContentSize() const
 bool FVColorPickerViewController::wantsMaterial() const
 {
     return d->wantsMaterial;
+}
+
+bool FVColorPickerViewController::isResponding() const
+{
+    return d->responding;
 }
 
 bool FVColorPickerViewController::isEyedropperAvailable() const

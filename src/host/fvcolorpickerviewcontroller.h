@@ -56,6 +56,7 @@ class FAVRIN_HOST_EXPORT FVColorPickerViewController : public QObject
     Q_PROPERTY(bool wantsMaterial READ wantsMaterial NOTIFY wantsMaterialChanged)
     Q_PROPERTY(State state READ state NOTIFY stateChanged)
     Q_PROPERTY(bool presented READ isPresented NOTIFY stateChanged)
+    Q_PROPERTY(bool responding READ isResponding NOTIFY respondingChanged)
 
 public:
     /** A light or a dark look; Unspecified leaves the choice to what surrounds. */
@@ -223,6 +224,13 @@ public:
     /** The picker is on screen, or will be as soon as its process has drawn. */
     bool isPresented() const { return state() == State::Starting || state() == State::Ready; }
 
+    /**
+     * False while the picker's process has not answered for some seconds. One that never answers again is ended after
+     * ten more, which colorPickerViewServiceDidTerminateWithError() reports; an app that does not want to wait may
+     * dismiss() and present() at any moment, and gets another process. A picker that is merely slow is left alone.
+     */
+    bool isResponding() const;
+
     /** Shows the picker over the content of the window. Does nothing while it is presented already. */
     Q_INVOKABLE void present(QQuickWindow *window);
     /** Shows the picker in a popover that points at @p anchor. */
@@ -289,6 +297,7 @@ Q_SIGNALS:
     void wantsMaterialChanged();
     void stateChanged();
     ///@}
+    void respondingChanged();
 
 private:
     class Q_DECL_HIDDEN Private;

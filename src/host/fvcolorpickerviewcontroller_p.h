@@ -13,6 +13,7 @@ public:
     QList<FVColor> suggestedColors;
     QSizeF preferredContentSize = QSizeF(0, 0);
     bool wantsMaterial = false;
+    bool responding = true;
 
     /** Stores @p value through @p field of the wishes; false when it is there already. */
     template<class Field, class Value>

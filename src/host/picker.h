@@ -75,6 +75,7 @@ Q_SIGNALS:
     void eyedropperAvailableChanged();
     void finished();
     void terminated(const QString &error);
+    void respondingChanged(bool responding);
     void preferredContentSizeChanged(QSizeF size);
     void materialChanged(bool wanted);
     void surroundingsChanged();

@@ -6,6 +6,7 @@
 #include "host/remoteviewitem.h"
 #include "host/remoteviewsession.h"
 #include "host/serviceahead.h"
+#include "host/servicewatch.h"
 
 #include <QEvent>
 #include <QGuiApplication>
@@ -194,12 +195,26 @@ void RemotePicker::connectSession()
     connect(session, &RemoteViewSession::pickerDidShowEyedropper, this, &RemotePicker::eyedropperShown);
     connect(session, &RemoteViewSession::pickerDidFloatEyedropper, this, &RemotePicker::eyedropperFloated);
     connect(session, &RemoteViewSession::pickerDidDismissEyedropper, this, &RemotePicker::eyedropperDismissed);
-    // The session must not go while it speaks.
-    connect(session, &RemoteViewSession::colorPickerDidFinish, this, &RemotePicker::serviceFinished,
-            Qt::QueuedConnection);
-    connect(session, &RemoteViewSession::ended, this, &RemotePicker::serviceEnded, Qt::QueuedConnection);
+    // The session must not go while it speaks; and when its last word is heard, another one may be shown already.
+    connect(
+        session, &RemoteViewSession::colorPickerDidFinish, this,
+        [this, session] {
+            if (m_session.get() == session)
+                serviceFinished();
+        },
+        Qt::QueuedConnection);
+    connect(
+        session, &RemoteViewSession::ended, this,
+        [this, session](const QString &error) {
+            if (m_session.get() == session)
+                serviceEnded(error);
+        },
+        Qt::QueuedConnection);
     connect(session, &RemoteViewSession::preferredContentSizeDidChange, this, &RemotePicker::followService);
     connect(session, &RemoteViewSession::backgroundEffectDidChange, this, &RemotePicker::followService);
+    m_watch = std::make_unique<ServiceWatch>(*session);
+    connect(m_watch.get(), &ServiceWatch::respondingChanged, this, &RemotePicker::respondingChanged);
+    connect(m_watch.get(), &ServiceWatch::gaveUp, session, &RemoteViewSession::giveUp);
     followService();
 }
 
@@ -313,6 +328,7 @@ void RemotePicker::serviceFinished()
     if (!isPresented() && state() != State::Stopping)
         return;
     tearDown();
+    Q_EMIT respondingChanged(true);
     setState(State::NotRunning);
     Q_EMIT finished();
 }
@@ -326,6 +342,7 @@ void RemotePicker::serviceEnded(const QString &error)
     if (!isPresented())
         return;
     tearDown();
+    Q_EMIT respondingChanged(true);
     setState(State::Failed);
     Q_EMIT terminated(error);
 }
@@ -333,6 +350,7 @@ void RemotePicker::serviceEnded(const QString &error)
 void RemotePicker::tearDown()
 {
     m_farewell.stop();
+    m_watch.reset();
     m_sentTraits.reset();
     m_sentConfiguration.reset();
     if (m_presentation && m_presentation->view())

@@ -8,6 +8,7 @@ namespace favrin::host {
 
 class Presentation;
 class RemoteViewSession;
+class ServiceWatch;
 
 /**
  * One picker of an app through all its presentations: an explicit state, one function for each change of it, and what
@@ -54,6 +55,7 @@ private:
     std::optional<platform::Color> m_selectedColor;
     bool m_selectedColorIsSet = false;
     std::unique_ptr<RemoteViewSession> m_session;
+    std::unique_ptr<ServiceWatch> m_watch;
     std::unique_ptr<Presentation> m_presentation;
     QTimer m_farewell;
     quint32 m_serial = 0;

@@ -166,6 +166,12 @@ void RemoteViewSession::dispatch()
     m_server->dispatch();
     m_server->flush();
 }
+void RemoteViewSession::giveUp()
+{
+    finish(QStringLiteral("The color picker's process does not answer."));
+    m_server->closeConnection();
+}
+
 
 void RemoteViewSession::finish(const QString &error)
 {

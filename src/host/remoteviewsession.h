@@ -37,6 +37,8 @@ public:
     /** The service has built its views. */
     bool isReady() const { return m_ready; }
     /** For those who must find the process, e.g. a test that kills it; 0 when it does not run. */
+    /** Ends a process that does not answer; ended() says so. */
+    void giveUp();
     qint64 processIdentifier() const;
 
     RemoteSurface &surface() { return m_surface; }
@@ -46,6 +48,8 @@ public:
     /** Milliseconds on the clock that input events to the service use. */
     std::uint32_t now() const { return static_cast<std::uint32_t>(m_clock.elapsed()); }
 
+    /** Takes in what has arrived, without waiting for the event loop. */
+    void receive() { dispatch(); }
     const server::TextInputState &textInput() const { return m_textInput; }
     /** What the service said last, perhaps before anybody listened: it may have been started ahead of time. */
     remote::BackgroundEffect backgroundEffect() const { return m_backgroundEffect; }

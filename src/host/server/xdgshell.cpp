@@ -48,7 +48,9 @@ XdgShell::XdgShell(Connection &connection, Screens &screens) : m_connection(conn
 
 void XdgShell::bind(wl_client *client, int version, std::uint32_t id)
 {
-    m_resources.add(client, xdg_wm_base_interface, version, id, requests(), this);
+    wl_resource *shell = m_resources.add(client, xdg_wm_base_interface, version, id, requests(), this);
+    if (shell && m_openPing != 0)
+        xdg_wm_base_send_ping(shell, m_openPing);
 }
 
 void XdgShell::configure(int width, int height)
@@ -75,8 +77,9 @@ void XdgShell::ping()
             m_connection.delegate().serviceResponsivenessDidChange(false);
         return;
     }
-    if (m_resources.isEmpty() || !m_connection.admitsEvent())
+    if (!m_connection.admitsEvent())
         return;
+    // Of a service that has not come so far as to bind the shell, the question is open until it has.
     m_openPing = m_connection.nextSerial();
     m_resources.forEach([this](wl_resource *shell) { xdg_wm_base_send_ping(shell, m_openPing); });
 }

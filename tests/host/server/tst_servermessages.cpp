@@ -340,6 +340,17 @@ private Q_SLOTS:
         QCOMPARE(pair.delegate.calls, Lines{"unresponsive"});
     }
 
+    void aServiceThatHasNotComeYetIsAskedWhenItCame()
+    {
+        PresentedPair pair(PresentedPair::Start::Unbound);
+        pair.server.ping();
+        pair.server.ping();
+        QCOMPARE(pair.delegate.calls, Lines{"unresponsive"});
+        pair.service.bindAll();
+        pair.exchange();
+        QVERIFY(std::ranges::find(pair.delegate.calls, "responsive") != pair.delegate.calls.end());
+    }
+
 private:
     OpenFiles m_files;
 };

@@ -1,0 +1,49 @@
+#include "host/servicewatch.h"
+
+#include "host/remoteviewsession.h"
+
+namespace favrin::host {
+
+using namespace std::chrono_literals;
+
+namespace {
+
+constexpr auto timeBetweenQuestions = 2000ms;
+/** Questions that are due while one is open. The first is reported, the last ends the picker. */
+constexpr int mostUnanswered = 5;
+/** Likewise, for a process that still loads its libraries. */
+constexpr int mostUnansweredAtStart = 15;
+
+} // namespace
+
+ServiceWatch::ServiceWatch(RemoteViewSession &session, QObject *parent) : QObject(parent), m_session(session)
+{
+    connect(&session, &RemoteViewSession::responsivenessDidChange, this, &ServiceWatch::responsivenessDidChange);
+    connect(&m_timer, &QTimer::timeout, this, &ServiceWatch::ask);
+    m_timer.start(timeBetweenQuestions);
+}
+
+void ServiceWatch::ask()
+{
+    // The answer may be here already: after a standstill of the app its timers come before its sockets.
+    m_session.receive();
+    if (m_session.hasEnded())
+        return;
+    m_session.server().ping();
+    m_session.flush();
+    if (m_responding)
+        return;
+    if (++m_unanswered < (m_session.isReady() ? mostUnanswered : mostUnansweredAtStart))
+        return;
+    m_timer.stop();
+    Q_EMIT gaveUp();
+}
+
+void ServiceWatch::responsivenessDidChange(bool responsive)
+{
+    m_responding = responsive;
+    m_unanswered = 0;
+    Q_EMIT respondingChanged(responsive);
+}
+
+} // namespace favrin::host

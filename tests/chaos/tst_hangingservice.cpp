@@ -1,0 +1,88 @@
+#include "chaoshost.h"
+
+#include <QFile>
+
+/** A process that does not answer is noticed and can be replaced; one that is slow is left alone. */
+class HangingServiceTest : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void itIsNoticedReplacedAndGivenUp()
+    {
+        // All at once: most of this is waiting.
+        ChaosHost replaced;
+        ChaosHost givenUp;
+        ChaosHost slow;
+        const pid_t ofReplaced = presented(replaced);
+        const pid_t ofGivenUp = presented(givenUp);
+        const pid_t ofSlow = presented(slow);
+        QSignalSpy slowReports(&slow.picker, &FVColorPickerViewController::respondingChanged);
+        QSignalSpy reports(&replaced.picker, &FVColorPickerViewController::respondingChanged);
+        for (const pid_t process : {ofReplaced, ofGivenUp, ofSlow})
+            QCOMPARE(kill(process, SIGSTOP), 0);
+        const SignalSoon wakesUp(ofSlow, SIGCONT, std::chrono::milliseconds(1200));
+
+        QTRY_VERIFY_WITH_TIMEOUT(!replaced.picker.isResponding(), patience);
+        QCOMPARE(reports.size(), 1);
+        QVERIFY(replaced.picker.isPresented());
+        replaced.picker.dismiss();
+        QTRY_COMPARE(replaced.finished.size(), 1);
+        QVERIFY(replaced.picker.isResponding());
+        const pid_t replacement = presented(replaced);
+        QVERIFY(replacement != ofReplaced);
+        replaced.click(replaced.swatch(0, 11));
+        QTRY_VERIFY(!replaced.picks.empty());
+        // Nobody waits for the one that was left behind.
+        QTRY_VERIFY(!QFileInfo::exists(QStringLiteral("/proc/%1/exe").arg(ofReplaced)));
+
+        QTRY_COMPARE_WITH_TIMEOUT(givenUp.terminated.size(), 1, patience);
+        QVERIFY(givenUp.terminated[0][0].toString().contains(u"does not answer"));
+        QVERIFY(givenUp.picker.isResponding());
+        QTRY_VERIFY(!QFileInfo::exists(QStringLiteral("/proc/%1/exe").arg(ofGivenUp)));
+
+        QVERIFY(slowReports.isEmpty());
+        QVERIFY(slow.isReady());
+        slow.click(slow.swatch(0, 0));
+        QTRY_VERIFY(!slow.picks.empty());
+    }
+
+    void oneThatHangsAtItsStartIsNoticed()
+    {
+        QTemporaryDir folder;
+        QFile program(folder.path() + QStringLiteral("/service"));
+        QVERIFY(program.open(QIODevice::WriteOnly));
+        program.write("#!/bin/sh\nexec sleep 60 >/dev/null 2>&1\n");
+        program.close();
+        QVERIFY(program.setPermissions(QFile::ReadUser | QFile::ExeUser));
+        qputenv("FAVRIN_COLOR_PICKER_SERVICE", QFile::encodeName(program.fileName()));
+        ChaosHost host;
+        host.present();
+        QTRY_VERIFY_WITH_TIMEOUT(!host.picker.isResponding(), patience);
+        host.picker.dismiss();
+        QTRY_COMPARE(host.finished.size(), 1);
+        qunsetenv("FAVRIN_COLOR_PICKER_SERVICE");
+        presented(host);
+    }
+
+private:
+    static constexpr int patience = 60'000;
+
+    pid_t presented(ChaosHost &host)
+    {
+        const auto before = servicesOf(getpid());
+        host.present();
+        if (!QTest::qWaitFor([&] { return host.isReady(); }, patience))
+            return 0;
+        for (const pid_t service : servicesOf(getpid())) {
+            if (std::ranges::find(before, service) == before.end())
+                return service;
+        }
+        return 0;
+    }
+
+    Settings m_settings;
+};
+
+QTEST_MAIN(HangingServiceTest)
+#include "tst_hangingservice.moc"

@@ -1,0 +1,257 @@
+#include "chaoshost.h"
+
+#include <fcntl.h>
+#include <sys/mount.h>
+#include <sys/stat.h>
+
+namespace {
+
+const auto someBytes = QByteArrayLiteral("what somebody put here");
+
+bool writeFile(const QString &path, const QByteArray &bytes, qint64 size = -1)
+{
+    QFile file(path);
+    return file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() && (size < 0 || file.resize(size));
+}
+
+/** A small disk of its own; needs the rights to mount one. */
+class SmallDisk
+{
+public:
+    explicit SmallDisk(QString folder) : m_folder(std::move(folder))
+    {
+        m_mounted = ::mount("tmpfs", path(), "tmpfs", 0, "size=256k") == 0;
+    }
+    ~SmallDisk()
+    {
+        if (m_mounted)
+            ::umount2(path(), MNT_DETACH);
+    }
+    SmallDisk(const SmallDisk &) = delete;
+    SmallDisk &operator=(const SmallDisk &) = delete;
+
+    bool isMounted() const { return m_mounted; }
+    /** Leaves this many pages free. */
+    void fill(int freePages) const
+    {
+        QFile file(m_folder + QStringLiteral("/filler"));
+        QVERIFY(file.open(QIODevice::WriteOnly | QIODevice::Unbuffered));
+        while (file.write(QByteArray(4096, 'x')) == 4096) {
+        }
+        QVERIFY(file.resize(file.size() / 4096 * 4096 - freePages * 4096));
+    }
+    void makeRoom() const { QVERIFY(QFile::remove(m_folder + QStringLiteral("/filler"))); }
+    bool setReadOnly(bool readOnly) const
+    {
+        return ::mount("tmpfs", path(), "tmpfs", MS_REMOUNT | (readOnly ? MS_RDONLY : 0), "size=256k") == 0;
+    }
+
+private:
+    const char *path() const { return (m_path = QFile::encodeName(m_folder)).constData(); }
+
+    QString m_folder;
+    mutable QByteArray m_path;
+    bool m_mounted = false;
+};
+
+} // namespace
+
+/** The file of the favorites, and everything that may happen to it. */
+class SettingsTest : public QObject
+{
+    Q_OBJECT
+
+private Q_SLOTS:
+    void cleanup()
+    {
+        QTRY_VERIFY(servicesOf(getpid()).empty());
+        m_settings.clear();
+    }
+
+    void whatIsNoStoreIsSetAside_data()
+    {
+        QTest::addColumn<QString>("what");
+        QTest::addColumn<bool>("isSetAside");
+        for (const char *what : {"garbage", "large", "folder", "pipe", "link to nothing", "link in a circle"})
+            QTest::newRow(what) << QString::fromLatin1(what) << true;
+        QTest::newRow("empty") << QStringLiteral("empty") << false;
+        QTest::newRow("link to a store") << QStringLiteral("link to a store") << false;
+    }
+
+    void whatIsNoStoreIsSetAside()
+    {
+        QFETCH(QString, what);
+        QFETCH(bool, isSetAside);
+        place(what);
+        ChaosHost host;
+        addOne(host);
+        QTRY_COMPARE(m_settings.favorites(), withAdded(1));
+        const auto aside = m_settings.entries().filter(QStringLiteral("damaged"));
+        QCOMPARE(aside.size(), isSetAside ? 1 : 0);
+        if (what == u"garbage") {
+            QFile kept(m_settings.folder() + u'/' + aside[0]);
+            QVERIFY(kept.open(QIODevice::ReadOnly));
+            QCOMPARE(kept.readAll(), someBytes);
+        }
+    }
+
+    void itMayBeReplacedWhileAPickerIsShown_data()
+    {
+        QTest::addColumn<QString>("by");
+        for (const char *by : {"nothing", "garbage", "folder", "empty"})
+            QTest::newRow(by) << QString::fromLatin1(by);
+    }
+
+    void itMayBeReplacedWhileAPickerIsShown()
+    {
+        QFETCH(QString, by);
+        ChaosHost host;
+        addOne(host);
+        QTRY_COMPARE(m_settings.favorites(), withAdded(1));
+        m_settings.clear();
+        place(by);
+        // The picker still knows what it shows, and the next change stores that.
+        host.addFavorite(gray(101), 6);
+        QTRY_COMPARE(m_settings.favorites().last(), gray(101).toQColor().name().mid(1));
+        QVERIFY(host.isReady() && host.terminated.isEmpty());
+    }
+
+    void aFullDiskLosesNothing_data()
+    {
+        QTest::addColumn<int>("freePages");
+        for (const int pages : {0, 1, 2, 3, 8})
+            QTest::addRow("%d pages free", pages) << pages;
+    }
+
+    void aFullDiskLosesNothing()
+    {
+        QFETCH(int, freePages);
+        const SmallDisk disk(m_settings.folder());
+        if (!disk.isMounted())
+            QSKIP("needs the right to mount a disk");
+        {
+            ChaosHost host;
+            addOne(host);
+            QTRY_COMPARE(m_settings.favorites(), withAdded(1));
+            disk.fill(freePages);
+            host.addFavorite(gray(101), 6);
+            host.click(host.swatch(2, 2));
+            QTRY_VERIFY(!host.picks.empty());
+            // The old list or the new one; both are whole.
+            const auto stored = m_settings.favorites();
+            QVERIFY2(stored == withAdded(1) || stored == withAdded(2), qPrintable(stored.join(u' ')));
+            QVERIFY(host.isReady() && host.terminated.isEmpty());
+            disk.makeRoom();
+            host.addFavorite(gray(102), 7);
+            QTRY_COMPARE(m_settings.favorites(), withAdded(3));
+        }
+        QTRY_VERIFY(servicesOf(getpid()).empty());
+    }
+
+    void aReadOnlyDiskIsNoObstacle()
+    {
+        const SmallDisk disk(m_settings.folder());
+        if (!disk.isMounted())
+            QSKIP("needs the right to mount a disk");
+        {
+            ChaosHost host;
+            addOne(host);
+            QTRY_COMPARE(m_settings.favorites(), withAdded(1));
+            host.picker.dismiss();
+            QTRY_COMPARE(host.finished.size(), 1);
+            QTRY_VERIFY(servicesOf(getpid()).empty());
+            QVERIFY(disk.setReadOnly(true));
+            host.present();
+            QTRY_VERIFY(host.isReady());
+            host.addFavorite(gray(101), 6);
+            host.picks.clear();
+            // What cannot be stored is there all the same, as long as the picker is.
+            const QPoint added = host.favorite(1, 2);
+            QTRY_COMPARE(QColor(host.window.grabWindow().pixel(added)), gray(101).toQColor());
+            QVERIFY(disk.setReadOnly(false));
+            host.addFavorite(gray(102), 7);
+            QTRY_COMPARE(m_settings.favorites(), withAdded(3));
+            QVERIFY(host.terminated.isEmpty());
+        }
+        QTRY_VERIFY(servicesOf(getpid()).empty());
+    }
+
+    void severalPickersSaveAtOnce_data()
+    {
+        QTest::addColumn<int>("pickers");
+        QTest::newRow("two") << 2;
+        QTest::newRow("eight") << 8;
+    }
+
+    void severalPickersSaveAtOnce()
+    {
+        QFETCH(int, pickers);
+        std::vector<std::unique_ptr<ChaosHost>> hosts;
+        for (int number = 0; number < pickers; ++number) {
+            hosts.push_back(std::make_unique<ChaosHost>());
+            hosts.back()->present();
+        }
+        for (const auto &host : hosts)
+            QTRY_VERIFY_WITH_TIMEOUT(host->isReady(), 30'000);
+        for (int number = 0; number < pickers; ++number)
+            hosts[std::size_t(number)]->addFavorite(gray(100 + number), 5);
+        // Each has saved when it answers to what came after.
+        for (const auto &host : hosts) {
+            host->click(host->swatch(1, 1));
+            QTRY_VERIFY(!host->picks.empty() && !host->picks.back().isVolatile);
+        }
+        const auto stored = m_settings.favorites();
+        QCOMPARE(stored.mid(0, 5), Settings::defaultFavorites());
+        auto added = stored.mid(5);
+        QVERIFY2(!added.isEmpty() && added.size() <= pickers, qPrintable(stored.join(u' ')));
+        QCOMPARE(added.removeDuplicates(), 0);
+        for (const auto &host : hosts)
+            QVERIFY(host->terminated.isEmpty());
+    }
+
+private:
+    /** Shows a picker and keeps a first favorite. */
+    static void addOne(ChaosHost &host)
+    {
+        host.present();
+        QTRY_VERIFY(host.isReady());
+        host.addFavorite(gray(100), 5);
+    }
+
+    static QStringList withAdded(int count)
+    {
+        auto list = Settings::defaultFavorites();
+        for (int number = 0; number < count; ++number)
+            list << gray(100 + number).toQColor().name().mid(1);
+        return list;
+    }
+
+    void place(const QString &what) const
+    {
+        const QString file = m_settings.file();
+        const QByteArray path = QFile::encodeName(file);
+        if (what == u"garbage")
+            QVERIFY(writeFile(file, someBytes));
+        else if (what == u"empty")
+            QVERIFY(writeFile(file, {}));
+        else if (what == u"large")
+            QVERIFY(writeFile(file, someBytes, 100'000'000));
+        else if (what == u"folder")
+            QVERIFY(QDir().mkpath(file + QStringLiteral("/folder")));
+        else if (what == u"pipe")
+            QCOMPARE(::mkfifo(path.constData(), 0600), 0);
+        else if (what == u"link to nothing")
+            QVERIFY(QFile::link(QStringLiteral("/nowhere/at/all"), file));
+        else if (what == u"link in a circle")
+            QVERIFY(QFile::link(file, file));
+        else if (what == u"link to a store")
+            QVERIFY(writeFile(m_elsewhere.filePath(QStringLiteral("store")), {}) &&
+                    QFile::link(m_elsewhere.filePath(QStringLiteral("store")), file));
+    }
+
+    Settings m_settings;
+    QTemporaryDir m_elsewhere;
+};
+
+QTEST_MAIN(SettingsTest)
+#include "tst_settings.moc"
