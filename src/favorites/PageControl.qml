@@ -12,12 +12,17 @@ PageControlBridge {
     Accessible.onIncreaseAction: value += 1
     Accessible.onDecreaseAction: value -= 1
 
+    // As high as a finger needs.
+    readonly property real touchMargin: Math.max(44 - height, 0) / 2
+
     TapHandler {
+        margin: indicator.touchMargin
         onTapped: (eventPoint) => indicator.tap(eventPoint.position.x)
     }
 
     DragHandler {
         target: null
+        margin: indicator.touchMargin
         yAxis.enabled: false
         onActiveChanged: {
             if (active)

@@ -6,6 +6,8 @@
 namespace favrin::favorites {
 namespace {
 
+/** What a finger needs, in points. */
+constexpr double fingerSize = 44.0;
 constexpr double smallestWidth = 50.0;
 constexpr int mostSwatchesPerPage = 16;
 /** A drag slower than this at its end is judged by where it ends. */
@@ -89,14 +91,15 @@ QRectF PageLayout::frame(int place) const
 
 std::optional<int> PageLayout::placeAt(QPointF point, int itemCount) const
 {
+    const double reach = std::clamp((fingerSize - m_metrics.size) / 2.0, 0.0, m_metrics.gap / 2.0);
     const QRectF content(0.0, 0.0, contentWidth(itemCount), stripHeight(m_metrics));
-    if (!content.contains(point))
+    if (!content.adjusted(-reach, -reach, reach, reach).contains(point))
         return std::nullopt;
-    const int column = static_cast<int>(point.x() / pitch());
-    const int row = static_cast<int>(point.y() / pitch());
+    const int column = static_cast<int>((point.x() + reach) / pitch());
+    const int row = static_cast<int>((point.y() + reach) / pitch());
     const int page = column / m_columns;
     const int place = page * swatchesPerPage() + row * m_columns + column % m_columns;
-    if (place >= itemCount || !frame(place).contains(point))
+    if (place >= itemCount || !frame(place).adjusted(-reach, -reach, reach, reach).contains(point))
         return std::nullopt;
     return place;
 }

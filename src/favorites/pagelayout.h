@@ -70,7 +70,7 @@ public:
 
     /** The area of an item within the content. */
     QRectF frame(int place) const;
-    /** The item at a point of the content. */
+    /** The item that a finger at a point of the content means: swatches reach as far as it needs. */
     std::optional<int> placeAt(QPointF point, int itemCount) const;
     /** The first item that may be seen at an offset, and the one after the last. */
     std::pair<int, int> visiblePlaces(double offset, int itemCount) const;

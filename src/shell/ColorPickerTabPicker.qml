@@ -14,7 +14,6 @@ Item {
 
     readonly property real cornerRadius: 9
     readonly property real gap: 2
-    readonly property real touchHeight: 44
     readonly property real segmentWidth: width / Math.max(segments.titles.length, 1)
 
     /* Where a segment starts: the first one at the leading edge. */
@@ -67,11 +66,7 @@ Item {
             x: picker.segmentX(index)
             width: picker.segmentWidth
             height: picker.height
-            containmentMask: Item {
-                y: (picker.height - height) / 2
-                width: picker.segmentWidth
-                height: Math.max(picker.height, picker.touchHeight)
-            }
+            containmentMask: TouchMask { face: segment }
             checked: index === segments.current
             focusPolicy: Qt.NoFocus
             text: modelData

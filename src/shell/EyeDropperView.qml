@@ -12,7 +12,7 @@ MouseArea {
 
     required property ColorPickerState colorPickerState
 
-    readonly property real touchArea: 44
+    readonly property real litSize: 36
     readonly property real symbolSize: Math.round(Theme.barSymbolSize * 1.2)
     readonly property bool isLit: pressed || containsMouse || keyIsDown
     property bool keyIsDown: false
@@ -32,12 +32,7 @@ MouseArea {
     // The finger is the eyedropper's from here on, wherever it goes.
     preventStealing: true
     hoverEnabled: true
-    containmentMask: Item {
-        x: (button.width - width) / 2
-        y: (button.height - height) / 2
-        width: button.touchArea
-        height: button.touchArea
-    }
+    containmentMask: TouchMask { face: button }
 
     onPressed: begin()
     onReleased: letGo()
@@ -72,7 +67,7 @@ MouseArea {
 
     Rectangle {
         anchors.centerIn: parent
-        width: button.touchArea - 8
+        width: button.litSize
         height: width
         radius: 8
         color: Theme.fill

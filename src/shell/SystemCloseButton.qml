@@ -10,18 +10,12 @@ T.AbstractButton {
     required property string label
 
     readonly property real diameter: Math.round(Theme.barSymbolSize * 30 / 17)
-    readonly property real touchArea: 44
 
     implicitWidth: diameter
     implicitHeight: diameter
     focusPolicy: Qt.StrongFocus
     hoverEnabled: true
-    containmentMask: Item {
-        x: (button.width - width) / 2
-        y: (button.height - height) / 2
-        width: button.touchArea
-        height: button.touchArea
-    }
+    containmentMask: TouchMask { face: button }
 
     Accessible.role: Accessible.Button
     Accessible.name: label

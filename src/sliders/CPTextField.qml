@@ -28,6 +28,7 @@ FieldBackground {
         horizontalAlignment: TextInput.AlignHCenter
         verticalAlignment: TextInput.AlignVCenter
         clip: true
+        containmentMask: TouchMask { face: input }
         selectByMouse: true
         activeFocusOnTab: true
         font.family: Theme.bodyFont.family

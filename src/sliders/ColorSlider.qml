@@ -38,6 +38,7 @@ Item {
         anchors.bottom: parent.bottom
         colorPickerState: row.colorPickerState
         component: row.component
+        containmentMask: TouchMask { face: slider }
         Accessible.role: Accessible.Slider
 
         SliderTrack {

@@ -18,6 +18,7 @@ T.AbstractButton {
     implicitHeight: Math.max(label.implicitHeight, 36)
     enabled: colorPickerState.hasSelectedColor
     focusPolicy: Qt.StrongFocus
+    containmentMask: TouchMask { face: button }
 
     Accessible.role: Accessible.ButtonMenu
     Accessible.name: switcher.label

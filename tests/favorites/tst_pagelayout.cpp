@@ -106,11 +106,13 @@ void PageLayoutTest::everyPointFindsItsItem()
         const QRectF frame = layout.frame(place);
         QCOMPARE(layout.placeAt(frame.center(), count), std::optional(place));
         QCOMPARE(layout.placeAt(frame.topLeft() + QPointF(0.5, 0.5), count), std::optional(place));
-        QCOMPARE(layout.placeAt(frame.bottomRight() + QPointF(2.0, -2.0), count), std::nullopt);
+        QCOMPARE(layout.placeAt(frame.bottomRight() + QPointF(6.0, -2.0), count), std::optional(place));
+        QCOMPARE(layout.placeAt(frame.topLeft() + QPointF(-6.0, 2.0), count), std::optional(place));
+        QCOMPARE(layout.placeAt(frame.bottomRight() + QPointF(9.0, -2.0), count), std::nullopt);
         QCOMPARE(layout.placeAt(frame.center(), place), std::nullopt);
     }
-    QCOMPARE(layout.placeAt(QPointF(-1.0, 5.0), count), std::nullopt);
-    QCOMPARE(layout.placeAt(QPointF(5.0, -1.0), count), std::nullopt);
+    QCOMPARE(layout.placeAt(QPointF(-9.0, 5.0), count), std::nullopt);
+    QCOMPARE(layout.placeAt(QPointF(5.0, -9.0), count), std::nullopt);
     QCOMPARE(layout.placeAt(QPointF(1.0e300, 5.0), count), std::nullopt);
 }
 

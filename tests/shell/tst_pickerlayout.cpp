@@ -225,7 +225,8 @@ void PickerLayoutTest::touchAreasAreLargeEnough()
 {
     PickerWindow picker;
     QVERIFY(picker.isReady());
-    for (const char *name : {"Eyedropper_Accessibility", "Close", "Spectrum"}) {
+    picker.state.selectedTab.set(Tab::sliders);
+    for (const char *name : {"Eyedropper_Accessibility", "Close", "Spectrum", "Red", "Opacity", "sRGB Hex Color #"}) {
         const QQuickItem *item = picker.item(QString::fromLatin1(name));
         const double reach = std::max(0.0, 44.0 - item->height()) / 2;
         for (const double y : {-reach + 0.5, item->height() + reach - 0.5})
