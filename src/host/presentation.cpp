@@ -119,7 +119,8 @@ void Presentation::reveal(bool animated)
     for (QQuickItem *item : {static_cast<QQuickItem *>(m_scrim), static_cast<QQuickItem *>(m_panel)}) {
         if (!item || item->opacity() == 1.0)
             continue;
-        if (!animated) {
+        // A window that is still to appear shows the picker with its first frame.
+        if (!animated || !item->window() || !item->window()->isVisible()) {
             item->setOpacity(1);
             continue;
         }
