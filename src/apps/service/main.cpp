@@ -3,12 +3,14 @@
 #include "service/fvcolorpickerserviceviewcontroller.h"
 #include "shell/colorpickerviewfactory.h"
 
+#include <QFontMetricsF>
 #include <QGuiApplication>
 #include <QQmlEngine>
 #include <QQuickItem>
 #include <QQuickWindow>
 
 #include <cstdio>
+#include <thread>
 
 namespace {
 
@@ -37,6 +39,12 @@ void dropFarewell(QtMsgType type, const QMessageLogContext &context, const QStri
         previousMessageHandler(type, context, message);
 }
 
+/** Looks the fonts up beside the main thread, which has other things to do before its first text. */
+std::jthread fontLookUp()
+{
+    return std::jthread([] { QFontMetricsF(QFont()).height(); });
+}
+
 } // namespace
 
 int main(int argc, char *argv[])
@@ -55,6 +63,7 @@ int main(int argc, char *argv[])
     QGuiApplication application(argc, argv);
     QGuiApplication::setApplicationName(QStringLiteral("favrin-color-picker-service"));
     QGuiApplication::setDesktopFileName(QStringLiteral("favrin-color-picker"));
+    const std::jthread fonts = fontLookUp();
     // The host shows its own pointer; loading a theme of pointers here would cost the first touch of a drag 20 ms.
     QGuiApplication::setOverrideCursor(Qt::BlankCursor);
 
