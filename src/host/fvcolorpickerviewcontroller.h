@@ -248,7 +248,8 @@ public:
 
     /**
      * Starts one picker process ahead of time, so that the next presentation in this app is instant. It waits without
-     * using any processor time. Calling it again while one waits does nothing.
+     * using any processor time. Calling it again while one waits does nothing. A program that shows the picker at once
+     * may call it before it makes its QGuiApplication too, so that both start side by side.
      */
     Q_INVOKABLE static void startServiceAhead();
 
@@ -296,8 +297,8 @@ Q_SIGNALS:
     void preferredContentSizeChanged();
     void wantsMaterialChanged();
     void stateChanged();
-    ///@}
     void respondingChanged();
+    ///@}
 
 private:
     class Q_DECL_HIDDEN Private;

@@ -120,23 +120,35 @@ RemoteViewSession::~RemoteViewSession()
     end();
 }
 
-QString RemoteViewSession::start()
+QString RemoteViewSession::launch()
 {
     const int socket = m_server->openConnection();
     if (socket < 0)
         return QStringLiteral("No connection could be made: %1").arg(QString::fromLocal8Bit(std::strerror(errno)));
-    m_notifier = std::make_unique<QSocketNotifier>(m_server->fileDescriptor(), QSocketNotifier::Read);
-    connect(m_notifier.get(), &QSocketNotifier::activated, this, &RemoteViewSession::dispatch);
     connect(m_process.get(), &ServiceProcess::ended, this, [this](const QString &description) {
         // What the service still said before it ended is on the socket; the end of the connection comes behind it.
         dispatch();
         finish(QStringLiteral("The color picker's process ended: %1.").arg(description));
     });
-    const QString error = m_process->start(socket);
+    return m_process->start(socket);
+}
+
+void RemoteViewSession::attend()
+{
+    m_notifier = std::make_unique<QSocketNotifier>(m_server->fileDescriptor(), QSocketNotifier::Read);
+    connect(m_notifier.get(), &QSocketNotifier::activated, this, &RemoteViewSession::dispatch);
+    m_process->watch();
     // Compiling a keymap takes longer than anything else here; meanwhile the process is being loaded.
     m_server->setKeymap(hostKeymap());
     const auto *hints = QGuiApplication::styleHints();
     m_server->setRepeat(static_cast<int>(hints->keyboardAutoRepeatRate()), hints->keyboardInputInterval());
+}
+
+QString RemoteViewSession::start()
+{
+    const QString error = launch();
+    if (error.isEmpty())
+        attend();
     return error;
 }
 

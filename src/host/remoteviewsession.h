@@ -31,6 +31,9 @@ public:
 
     /** Starts the process. An error text when that fails, else empty. */
     QString start();
+    /** The two halves of it: the process alone, for which no application is needed; and from then on its server. */
+    QString launch();
+    void attend();
     /** Closes the connection; no signal follows. */
     void end();
     bool hasEnded() const { return m_ended; }

@@ -18,7 +18,9 @@ class ServiceAhead : public QObject
 public:
     static ServiceAhead &instance();
 
-    /** Starts one with these traits unless one waits already. */
+    /** Starts the process alone, unless one waits already: all that can be done before there is an application. */
+    void launch();
+    /** Starts one with these traits, or goes on with the one that was launched, unless one waits already. */
     void start(const remote::Traits &traits);
     bool isReady() const;
     /**
@@ -33,6 +35,7 @@ Q_SIGNALS:
 private:
     ServiceAhead();
 
+    std::unique_ptr<RemoteViewSession> m_launched;
     std::unique_ptr<RemoteViewSession> m_waiting;
     remote::DisplayGamut m_gamut = remote::DisplayGamut::SRGB;
 };

@@ -117,7 +117,10 @@ QString ServiceProcess::program()
     if (!chosen.isEmpty())
         return chosen;
     const auto name = QStringLiteral("favrin-color-picker-service");
-    for (const auto &folder : {folderOfThisLibrary(), QCoreApplication::applicationDirPath()}) {
+    QStringList folders = {folderOfThisLibrary()};
+    if (QCoreApplication::instance())
+        folders.append(QCoreApplication::applicationDirPath());
+    for (const auto &folder : folders) {
         const QFileInfo file(folder + u'/' + name);
         if (!folder.isEmpty() && file.isExecutable())
             return file.absoluteFilePath();
@@ -165,11 +168,17 @@ QString ServiceProcess::start(int socket)
         return QStringLiteral("%1: %2").arg(QFile::decodeName(path), QString::fromLocal8Bit(std::strerror(error)));
     }
     m_pidDescriptor = static_cast<int>(syscall(SYS_pidfd_open, m_pid, 0));
-    if (m_pidDescriptor >= 0) {
+    if (QCoreApplication::instance())
+        watch();
+    return {};
+}
+
+void ServiceProcess::watch()
+{
+    if (m_pidDescriptor >= 0 && !m_notifier) {
         m_notifier = std::make_unique<QSocketNotifier>(m_pidDescriptor, QSocketNotifier::Read);
         connect(m_notifier.get(), &QSocketNotifier::activated, this, &ServiceProcess::reap);
     }
-    return {};
 }
 
 void ServiceProcess::kill()

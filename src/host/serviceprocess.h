@@ -33,6 +33,8 @@ public:
      * else an empty text.
      */
     QString start(int socket);
+    /** Waits for the end of what was started. start() does so itself, except while there is no application yet. */
+    void watch();
     /** 0 when nothing runs. */
     pid_t processIdentifier() const { return m_pid; }
     void kill();

@@ -96,6 +96,8 @@ int main(int argc, char *argv[])
     const bool isDisplayNeeded = !isOffscreenWanted();
     previousMessageHandler = qInstallMessageHandler(failWithTheDisplay);
     prepareEnvironment(parsed.options->parent);
+    // While Qt opens the display here, the picker is being loaded there.
+    FVColorPickerViewController::startServiceAhead();
     int onlyTheName = 1;
     QGuiApplication application(onlyTheName, argv);
     if (isDisplayNeeded && QGuiApplication::platformName() == u"offscreen") {
