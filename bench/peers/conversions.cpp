@@ -38,13 +38,15 @@ std::vector<Triple> colors()
     return list;
 }
 
-template <class Number> Number decoded(Number value)
+template<class Number>
+Number decoded(Number value)
 {
     return value <= Number(0.04045L) ? value / Number(12.92L)
                                      : std::pow((value + Number(0.055L)) / Number(1.055L), Number(2.4L));
 }
 
-template <class Number> Number encoded(Number value)
+template<class Number>
+Number encoded(Number value)
 {
     value = std::clamp(value, Number(0), Number(1));
     return value <= Number(0.0031308L) ? Number(12.92L) * value
@@ -56,15 +58,16 @@ constexpr long double matrix[3][3] = {{0.822461968714362L, 0.177538031285638L, 0
                                       {0.0331941988509696L, 0.96680580114903L, 0.0L},
                                       {0.0170826307211993L, 0.072397440663963L, 0.910519928614838L}};
 
-template <class Number> std::array<Number, 3> plain(const std::array<Number, 3> &color)
+template<class Number>
+std::array<Number, 3> plain(const std::array<Number, 3> &color)
 {
     std::array<Number, 3> linear;
     std::array<Number, 3> result;
     for (std::size_t i = 0; i < 3; ++i)
         linear[i] = decoded(color[i]);
     for (std::size_t i = 0; i < 3; ++i)
-        result[i] = encoded(Number(matrix[i][0]) * linear[0] + Number(matrix[i][1]) * linear[1]
-                            + Number(matrix[i][2]) * linear[2]);
+        result[i] = encoded(Number(matrix[i][0]) * linear[0] + Number(matrix[i][1]) * linear[1] +
+                            Number(matrix[i][2]) * linear[2]);
     return result;
 }
 

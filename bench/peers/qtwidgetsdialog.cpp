@@ -1,5 +1,5 @@
-// Qt's widget color dialog: as a program of its own, or with --opening timed from its making in a running app to the end
-// of its first flush: the first in that process, another one, and the same again. One JSON object is printed.
+// Qt's widget color dialog: as a program of its own, or with --opening timed from its making in a running app to the
+// end of its first flush: the first in that process, another one, and the same again. One JSON object is printed.
 
 #include <QApplication>
 #include <QColorDialog>

@@ -15,6 +15,7 @@
 #include <cstring>
 #include <filesystem>
 #include <fstream>
+#include <map>
 #include <set>
 #include <sstream>
 #include <string>
@@ -48,8 +49,8 @@ int ignoreError(Display *, XErrorEvent *)
 bool isPainted(Display *display, Window window)
 {
     XWindowAttributes attributes;
-    if (!XGetWindowAttributes(display, window, &attributes) || attributes.map_state != IsViewable
-        || attributes.width < smallestDialog || attributes.height < smallestDialog)
+    if (!XGetWindowAttributes(display, window, &attributes) || attributes.map_state != IsViewable ||
+        attributes.width < smallestDialog || attributes.height < smallestDialog)
         return false;
     const int width = std::min(attributes.width, WidthOfScreen(attributes.screen) - attributes.x);
     const int height = std::min(attributes.height, HeightOfScreen(attributes.screen) - attributes.y);
@@ -141,8 +142,8 @@ Footprint footprint(pid_t process)
     if (values.size() > 12) {
         result.faults = std::atol(values[7].c_str());
         result.diskFaults = std::atol(values[9].c_str());
-        result.processorTime = (std::atof(values[11].c_str()) + std::atof(values[12].c_str()))
-            * 1000.0 / static_cast<double>(sysconf(_SC_CLK_TCK));
+        result.processorTime = (std::atof(values[11].c_str()) + std::atof(values[12].c_str())) * 1000.0 /
+                               static_cast<double>(sysconf(_SC_CLK_TCK));
     }
     std::set<std::string> libraries;
     std::istringstream maps(contents(folder + "/maps"));
@@ -155,23 +156,32 @@ Footprint footprint(pid_t process)
     return result;
 }
 
-/** How often the threads of a process have gone to sleep. */
-long sleeps(pid_t process)
+using Sleeps = std::map<std::string, long>;
+
+/** How often each thread of a process has gone to sleep. */
+Sleeps sleeps(pid_t process)
+{
+    Sleeps counts;
+    std::error_code error;
+    for (const auto &thread : std::filesystem::directory_iterator("/proc/" + std::to_string(process) + "/task", error))
+        counts[thread.path().string()] =
+            static_cast<long>(field(contents(thread.path().string() + "/status"), "\nvoluntary_ctxt_switches:"));
+    return counts;
+}
+
+/** Of the threads that are still there. */
+long sleepsBetween(const Sleeps &before, const Sleeps &after)
 {
     long count = 0;
-    std::error_code error;
-    for (const auto &thread :
-         std::filesystem::directory_iterator("/proc/" + std::to_string(process) + "/task", error))
-        count += static_cast<long>(field(contents(thread.path().string() + "/status"), "\nvoluntary_ctxt_switches:"));
+    for (const auto &[thread, number] : after)
+        count += number - (before.contains(thread) ? before.at(thread) : 0);
     return count;
 }
 
 std::string name(pid_t process)
 {
-    std::string text = contents("/proc/" + std::to_string(process) + "/comm");
-    while (!text.empty() && text.back() == '\n')
-        text.pop_back();
-    return text;
+    std::error_code error;
+    return std::filesystem::read_symlink("/proc/" + std::to_string(process) + "/exe", error).filename().string();
 }
 
 /** Lets events of the display pass for a while. */
@@ -206,7 +216,7 @@ void report(Display *display, pid_t process, double painted, int idleSeconds)
     addFamily(process, family);
     std::printf("{\"painted\": %.3f, \"processes\": [", painted);
     const char *separator = "";
-    std::vector<long> before;
+    std::vector<Sleeps> before;
     for (const pid_t member : family) {
         const Footprint print = footprint(member);
         std::printf("%s{\"name\": \"%s\", \"peak\": %.2f, \"pss\": %.2f, \"private\": %.2f, \"faults\": %ld, "
@@ -222,7 +232,8 @@ void report(Display *display, pid_t process, double painted, int idleSeconds)
         const long changes = changesWhile(display, std::chrono::seconds(idleSeconds));
         std::printf(", \"idle_seconds\": %d, \"idle_frames\": %ld, \"idle_wake_ups\": {", idleSeconds, changes);
         for (std::size_t i = 0; i < family.size(); ++i)
-            std::printf("%s\"%s\": %ld", i ? ", " : "", name(family[i]).c_str(), sleeps(family[i]) - before[i]);
+            std::printf("%s\"%s\": %ld", i ? ", " : "", name(family[i]).c_str(),
+                        sleepsBetween(before[i], sleeps(family[i])));
         std::printf("}");
     }
     std::printf("}\n");
