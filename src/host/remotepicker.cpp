@@ -358,8 +358,7 @@ void RemotePicker::tearDown()
     m_presentation.reset();
     if (m_session) {
         m_session->disconnect(this);
-        m_session->end();
-        m_session.release()->deleteLater();
+        m_session.release()->abandon();
     }
 }
 

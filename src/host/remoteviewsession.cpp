@@ -166,6 +166,21 @@ void RemoteViewSession::end()
     QTimer::singleShot(timeToLeave, process, &ServiceProcess::kill);
 }
 
+void RemoteViewSession::abandon()
+{
+    end();
+    m_abandoned = true;
+    // A loop that an app runs inside of one of our calls must not delete what that call still uses.
+    if (!m_telling)
+        deleteLater();
+}
+
+void RemoteViewSession::giveUp()
+{
+    finish(QStringLiteral("The color picker's process does not answer."));
+    m_server->closeConnection();
+}
+
 qint64 RemoteViewSession::processIdentifier() const
 {
     return m_process->processIdentifier();
@@ -175,15 +190,23 @@ void RemoteViewSession::dispatch()
 {
     if (m_ended)
         return;
+    if (m_telling) {
+        // An app runs a dialog inside a slot, say. What comes meanwhile waits, and must not keep its loop busy.
+        if (m_notifier)
+            m_notifier->setEnabled(false);
+        return;
+    }
+    m_telling = true;
     m_server->dispatch();
+    m_telling = false;
+    if (m_abandoned)
+        deleteLater();
+    if (m_ended)
+        return;
+    if (m_notifier)
+        m_notifier->setEnabled(true);
     m_server->flush();
 }
-void RemoteViewSession::giveUp()
-{
-    finish(QStringLiteral("The color picker's process does not answer."));
-    m_server->closeConnection();
-}
-
 
 void RemoteViewSession::finish(const QString &error)
 {

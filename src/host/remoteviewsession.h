@@ -37,22 +37,26 @@ public:
     /** Closes the connection; no signal follows. */
     void end();
     bool hasEnded() const { return m_ended; }
+    /** Ends a process that does not answer; ended() says so. */
+    void giveUp();
     /** The service has built its views. */
     bool isReady() const { return m_ready; }
     /** For those who must find the process, e.g. a test that kills it; 0 when it does not run. */
-    /** Ends a process that does not answer; ended() says so. */
-    void giveUp();
     qint64 processIdentifier() const;
 
     RemoteSurface &surface() { return m_surface; }
     /** Messages and input go to the server directly; call flush() behind them. */
     server::RemoteViewServer &server() { return *m_server; }
     void flush() { m_server->flush(); }
+    /** Takes in what has arrived, without waiting for the event loop. */
+    void receive() { dispatch(); }
+    /** end(), and deletes this object when nothing of it is in use any more. */
+    void abandon();
+    /** In the middle of telling something, perhaps to an app that runs a loop of its own over it. */
+    bool isTelling() const { return m_telling; }
     /** Milliseconds on the clock that input events to the service use. */
     std::uint32_t now() const { return static_cast<std::uint32_t>(m_clock.elapsed()); }
 
-    /** Takes in what has arrived, without waiting for the event loop. */
-    void receive() { dispatch(); }
     const server::TextInputState &textInput() const { return m_textInput; }
     /** What the service said last, perhaps before anybody listened: it may have been started ahead of time. */
     remote::BackgroundEffect backgroundEffect() const { return m_backgroundEffect; }
@@ -98,6 +102,8 @@ private:
     QSizeF m_preferredContentSize = QSizeF(0, 0);
     bool m_ready = false;
     bool m_ended = false;
+    bool m_telling = false;
+    bool m_abandoned = false;
 };
 
 } // namespace favrin::host

@@ -25,6 +25,8 @@ ServiceWatch::ServiceWatch(RemoteViewSession &session, QObject *parent) : QObjec
 
 void ServiceWatch::ask()
 {
+    if (m_session.isTelling())
+        return;
     // The answer may be here already: after a standstill of the app its timers come before its sockets.
     m_session.receive();
     if (m_session.hasEnded())

@@ -50,8 +50,8 @@ private Q_SLOTS:
         QVERIFY(memory > 0);
         for (int round = 0; round < rounds && !QTest::currentTestFailed(); ++round)
             presentOnce(host);
-        // What is left of the last process goes with a later turn of the event loop.
-        QTRY_COMPARE(openFiles(), files);
+        // What is left of a process goes with a later turn of the event loop.
+        QTRY_VERIFY(openFiles() <= files);
         QCOMPARE(threads(), before);
         checkGrowth(memory, rounds, "presentation");
     }

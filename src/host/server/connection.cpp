@@ -103,22 +103,35 @@ std::uint32_t Connection::now()
     return static_cast<std::uint32_t>(time.tv_sec * 1000 + time.tv_nsec / 1000000);
 }
 
+bool Connection::beginTurn()
+{
+    if (m_inTurn)
+        return false;
+    reap();
+    m_inTurn = true;
+    return true;
+}
+
+void Connection::endTurn()
+{
+    m_inTurn = false;
+}
+
 void Connection::readOnce()
 {
-    reap();
-    m_reading = true;
     wl_event_loop_dispatch(wl_display_get_event_loop(m_display), 0);
-    m_reading = false;
 }
 
 void Connection::flush()
 {
-    wl_display_flush_clients(m_display);
+    // It destroys a client that does not listen any more.
+    if (!m_inTurn)
+        wl_display_flush_clients(m_display);
 }
 
 void Connection::reap()
 {
-    if (m_client && m_failed && !m_reading)
+    if (m_client && m_failed && !m_inTurn)
         wl_client_destroy(m_client);
 }
 
@@ -130,7 +143,7 @@ std::optional<Connection::End> Connection::takeEnd()
 void Connection::close()
 {
     // In the middle of a read only an error keeps libwayland from handling what it has read already.
-    if (m_reading && isUsable())
+    if (m_inTurn && isUsable())
         wl_client_post_implementation_error(m_client, "closed");
     m_failed = true;
     m_end.reset();

@@ -46,8 +46,16 @@ public:
     /** Milliseconds of the monotonic clock. */
     static std::uint32_t now();
 
-    /** Reads and handles what one read of the socket gives. */
+    /**
+     * Between these two the client's objects are in use, by us or by libwayland, and stay there whatever happens. False
+     * when a turn is under way already: an owner's answer to what it is told may be a loop of its own.
+     */
+    bool beginTurn();
+    void endTurn();
+    bool isInTurn() const { return m_inTurn; }
+    /** Reads and handles what one read of the socket gives; in a turn. */
     void readOnce();
+    /** Between turns: a client that is gone goes with it. */
     void flush();
     /** Ends a connection that has failed; called between turns, when nothing of the client is in use. */
     void reap();
@@ -95,7 +103,7 @@ private:
     std::array<std::uint32_t, 32> m_inputSerials = {};
     std::size_t m_nextInputSlot = 0;
     int m_sendBuffer = 0;
-    bool m_reading = false;
+    bool m_inTurn = false;
     bool m_failed = false;
     std::optional<End> m_end;
 };

@@ -51,6 +51,7 @@ struct RemoteViewServer::Private
             showFrame();
         if (connection.isUsable())
             textInput.settle();
+        connection.endTurn();
         settle();
         connection.reap();
         if (const auto end = connection.takeEnd())
@@ -95,13 +96,17 @@ int RemoteViewServer::fileDescriptor() const
 
 void RemoteViewServer::dispatch()
 {
+    if (!d->connection.beginTurn())
+        return;
     d->connection.readOnce();
     d->endTurn();
 }
 
 void RemoteViewServer::flush()
 {
-    d->settle();
+    // What is said in the middle of a turn goes out at its end.
+    if (!d->connection.isInTurn())
+        d->settle();
 }
 
 void RemoteViewServer::configure(int width, int height, int scale)

@@ -150,7 +150,10 @@ public:
     int openConnection();
 
     int fileDescriptor() const;
-    /** Handles at most 4,096 bytes of requests and tells the delegate; of the frames among them only the newest. */
+    /**
+     * Handles at most 4,096 bytes of requests and tells the delegate; of the frames among them only the newest. Called
+     * from within a call of the delegate it does nothing.
+     */
     void dispatch();
     /** Sends what waits. What goes wrong here makes fileDescriptor() readable and is told by the next dispatch(). */
     void flush();

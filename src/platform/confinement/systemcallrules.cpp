@@ -93,6 +93,16 @@ constexpr std::initializer_list<int> aboutFiles = {
     SCMP_SYS(truncate), SCMP_SYS(truncate64),   SCMP_SYS(utime),     SCMP_SYS(utimensat),   SCMP_SYS(utimes),
 };
 
+scmp_arg_cmp differs(unsigned argument, scmp_datum_t value)
+{
+    return {argument, SCMP_CMP_NE, value, 0};
+}
+
+scmp_arg_cmp hasBits(unsigned argument, scmp_datum_t mask, scmp_datum_t value)
+{
+    return {argument, SCMP_CMP_MASKED_EQ, mask, value};
+}
+
 /** A row of refusals that remembers the first one that could not be made. */
 class Filter
 {
@@ -138,11 +148,11 @@ void refuseProcesses(Filter &filter)
     filter.refuse(aboutProcesses);
     // Its flags are in memory, where no filter sees them: the C library then makes its threads by clone().
     filter.refuse(SCMP_SYS(clone3), ENOSYS, {});
-    filter.refuse(SCMP_SYS(clone), EPERM, {SCMP_A0(SCMP_CMP_MASKED_EQ, CLONE_THREAD, 0)});
+    filter.refuse(SCMP_SYS(clone), EPERM, {hasBits(0, CLONE_THREAD, 0)});
     // To itself a process may send signals: abort() does.
     const auto self = static_cast<scmp_datum_t>(::getpid());
     for (const int call : {SCMP_SYS(kill), SCMP_SYS(tgkill), SCMP_SYS(rt_sigqueueinfo), SCMP_SYS(rt_tgsigqueueinfo)})
-        filter.refuse(call, EPERM, {SCMP_A0(SCMP_CMP_NE, self)});
+        filter.refuse(call, EPERM, {differs(0, self)});
 }
 
 } // namespace
@@ -152,10 +162,10 @@ int applySystemCallRules()
     Filter filter;
     filter.refuse(aboutTheSystem);
     filter.refuse(aboutFiles);
-    filter.refuse(SCMP_SYS(socket), EAFNOSUPPORT, {SCMP_A0(SCMP_CMP_NE, AF_UNIX)});
+    filter.refuse(SCMP_SYS(socket), EAFNOSUPPORT, {differs(0, AF_UNIX)});
     // Both put words into the mouth of whoever sits at a terminal that was inherited.
     for (const scmp_datum_t request : {TIOCSTI, TIOCLINUX})
-        filter.refuse(SCMP_SYS(ioctl), EPERM, {SCMP_A1(SCMP_CMP_MASKED_EQ, 0xffffffffU, request)});
+        filter.refuse(SCMP_SYS(ioctl), EPERM, {hasBits(1, 0xffffffffU, request)});
     if (processesAreRefused)
         refuseProcesses(filter);
     return filter.load();

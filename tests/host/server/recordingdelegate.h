@@ -2,6 +2,7 @@
 
 #include "host/server/remoteviewserver.h"
 
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -36,6 +37,8 @@ public:
             shown.pixels.insert(shown.pixels.end(), row, row + frame.width);
         }
         frames.push_back(std::move(shown));
+        if (onFrame)
+            onFrame();
     }
     void surfaceDidUnmap() override { calls.push_back("unmap"); }
     void serviceDidBind() override { calls.push_back("bind"); }
@@ -93,6 +96,8 @@ public:
     std::vector<std::vector<std::string>> offers;
     std::vector<std::string> warnings;
     std::vector<Close> closes;
+    /** What the host does when it hears of a frame, if anything. */
+    std::function<void()> onFrame;
     /** The server to close when the picker finishes, if any. */
     favrin::host::server::RemoteViewServer *closeOnFinish = nullptr;
 };

@@ -2,7 +2,10 @@
 
 #include "host/server/damage.h"
 
+#include <functional>
 #include <limits>
+
+#include <sys/socket.h>
 
 using namespace favrin::host::server;
 using Lines = std::vector<std::string>;
@@ -32,6 +35,40 @@ class ServerFramesTest : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
+    void theHostMayDoAnythingWhenAFrameArrives_data()
+    {
+        using Act = std::function<void(PresentedPair &)>;
+        QTest::addColumn<Act>("act");
+        QTest::addColumn<bool>("isToldOfTheEnd");
+        QTest::newRow("say something to a service that is gone") << Act([](PresentedPair &pair) {
+            pair.server.pointerEnter(1, 1);
+            pair.server.flush();
+        }) << true;
+        QTest::newRow("close the connection")
+            << Act([](PresentedPair &pair) { pair.server.closeConnection(); }) << false;
+        QTest::newRow("run a loop of its own") << Act([](PresentedPair &pair) { pair.server.dispatch(); }) << true;
+    }
+
+    void theHostMayDoAnythingWhenAFrameArrives()
+    {
+        QFETCH(std::function<void(PresentedPair &)>, act);
+        QFETCH(bool, isToldOfTheEnd);
+        PresentedPair pair(PresentedPair::Start::Mapped);
+        int heard = 0;
+        pair.delegate.onFrame = [&] {
+            ++heard;
+            // Killed just now.
+            ::shutdown(wl_display_get_fd(pair.service.display), SHUT_RDWR);
+            act(pair);
+        };
+        pair.service.commit(pair.service.makeBuffer(20, 10, 1), 20, 10);
+        pair.service.flush();
+        for (int turn = 0; turn < 4; ++turn)
+            pair.server.dispatch();
+        QCOMPARE(heard, 1);
+        QCOMPARE(pair.delegate.closes.size(), std::size_t(isToldOfTheEnd ? 1 : 0));
+    }
+
     void init() { m_files.remember(); }
     void cleanup() { m_files.check(); }
 
