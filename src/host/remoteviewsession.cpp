@@ -120,6 +120,12 @@ RemoteViewSession::~RemoteViewSession()
     end();
 }
 
+void RemoteViewSession::flush()
+{
+    m_server->flush();
+    Q_EMIT told();
+}
+
 QString RemoteViewSession::launch()
 {
     const int socket = m_server->openConnection();

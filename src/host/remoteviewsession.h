@@ -47,7 +47,7 @@ public:
     RemoteSurface &surface() { return m_surface; }
     /** Messages and input go to the server directly; call flush() behind them. */
     server::RemoteViewServer &server() { return *m_server; }
-    void flush() { m_server->flush(); }
+    void flush();
     /** Takes in what has arrived, without waiting for the event loop. */
     void receive() { dispatch(); }
     /** end(), and deletes this object when nothing of it is in use any more. */
@@ -64,6 +64,8 @@ public:
     QSizeF preferredContentSize() const { return m_preferredContentSize; }
 
 Q_SIGNALS:
+    /** Something may have been sent to the service. */
+    void told();
     void ready();
     void prepared(quint32 serial);
     /** The first and every further frame; the surface holds it already. */

@@ -2,6 +2,8 @@
 
 #include "host/remoteviewsession.h"
 
+#include <utility>
+
 namespace favrin::host {
 
 using namespace std::chrono_literals;
@@ -20,7 +22,17 @@ ServiceWatch::ServiceWatch(RemoteViewSession &session, QObject *parent) : QObjec
 {
     connect(&session, &RemoteViewSession::responsivenessDidChange, this, &ServiceWatch::responsivenessDidChange);
     connect(&m_timer, &QTimer::timeout, this, &ServiceWatch::ask);
+    connect(&session, &RemoteViewSession::told, this, &ServiceWatch::sessionDidTell);
     m_timer.start(timeBetweenQuestions);
+}
+
+void ServiceWatch::sessionDidTell()
+{
+    if (m_asking)
+        return;
+    m_told = true;
+    if (!m_timer.isActive())
+        m_timer.start();
 }
 
 void ServiceWatch::ask()
@@ -31,10 +43,15 @@ void ServiceWatch::ask()
     m_session.receive();
     if (m_session.hasEnded())
         return;
+    m_asking = true;
     m_session.server().ping();
     m_session.flush();
-    if (m_responding)
+    m_asking = false;
+    if (m_responding) {
+        if (!std::exchange(m_told, false))
+            m_timer.stop();
         return;
+    }
     if (++m_unanswered < (m_session.isReady() ? mostUnanswered : mostUnansweredAtStart))
         return;
     m_timer.stop();
@@ -45,6 +62,7 @@ void ServiceWatch::responsivenessDidChange(bool responsive)
 {
     m_responding = responsive;
     m_unanswered = 0;
+    m_told = true;
     Q_EMIT respondingChanged(responsive);
 }
 
