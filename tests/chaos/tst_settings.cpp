@@ -160,7 +160,8 @@ private Q_SLOTS:
             host.picker.dismiss();
             QTRY_COMPARE(host.finished.size(), 1);
             QTRY_VERIFY(servicesOf(getpid()).empty());
-            QVERIFY(disk.setReadOnly(true));
+            // Busy until the kernel is done with the files of the process that has just gone.
+            QTRY_VERIFY(disk.setReadOnly(true));
             host.present();
             QTRY_VERIFY(host.isReady());
             host.addFavorite(gray(101), 6);
