@@ -108,12 +108,6 @@ void Presentation::setAppearance(bool dark)
         m_panel->setAppearance(dark);
 }
 
-void Presentation::setMaterial(bool material)
-{
-    if (m_panel)
-        m_panel->setMaterial(material);
-}
-
 void Presentation::reveal(bool animated)
 {
     for (QQuickItem *item : {static_cast<QQuickItem *>(m_scrim), static_cast<QQuickItem *>(m_panel)}) {

@@ -38,7 +38,6 @@ public:
 
     void setPreferredContentSize(QSizeF size);
     void setAppearance(bool dark);
-    void setMaterial(bool material);
     /** Shows what was hidden so far; the picker has drawn. */
     void reveal(bool animated);
 

@@ -21,13 +21,11 @@ constexpr double shadowDrop = 6;
 constexpr QColor shadowColor(0, 0, 0, 64);
 constexpr double arrowHalfWidth = 13;
 
+/**
+ * Opaque, with the material that a picker may want and without: nothing behind the panel is blurred, and what showed
+ * through would only look like dirt. The picker's fields stand out from it.
+ */
 QColor panelColor(bool dark)
-{
-    return dark ? QColor(0x1c, 0x1c, 0x1e) : QColor(0xff, 0xff, 0xff);
-}
-
-/** Nothing behind the panel is blurred: what showed through would only look like dirt. */
-QColor materialColor(bool dark)
 {
     return dark ? QColor(0x26, 0x26, 0x29) : QColor(0xf2, 0xf2, 0xf6);
 }
@@ -110,14 +108,6 @@ void PresentationPanel::setAppearance(bool dark)
     update();
 }
 
-void PresentationPanel::setMaterial(bool material)
-{
-    if (m_material == material)
-        return;
-    m_material = material;
-    update();
-}
-
 QRectF PresentationPanel::contentRectangle() const
 {
     return {QPointF(surround, surround), m_layout.panel.size()};
@@ -153,7 +143,7 @@ void PresentationPanel::paint(QPainter *painter)
     painter->setRenderHint(QPainter::Antialiasing);
     // In place of the shadow, not over it: the panel may be translucent, and a clip would cost more than all the rest.
     painter->setCompositionMode(QPainter::CompositionMode_Source);
-    painter->fillPath(path, m_material ? materialColor(m_dark) : panelColor(m_dark));
+    painter->fillPath(path, panelColor(m_dark));
     painter->setCompositionMode(QPainter::CompositionMode_SourceOver);
     painter->strokePath(path, QPen(edgeColor(m_dark), 1));
 }

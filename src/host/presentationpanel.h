@@ -7,7 +7,7 @@
 
 namespace favrin::host {
 
-/** The panel behind a picker: rounded, with its arrow, shadow and material. Takes what falls on it. */
+/** The panel behind a picker: rounded, with its arrow and shadow. Takes what falls on it. */
 class PresentationPanel : public QQuickPaintedItem
 {
     Q_OBJECT
@@ -18,8 +18,6 @@ public:
     /** The panel's place in its parent; the item is larger by the shadow and the arrow. */
     void setLayout(const PresentationLayout &layout);
     void setAppearance(bool dark);
-    /** With the material the app's content shines through a little; without, the panel is opaque. */
-    void setMaterial(bool material);
 
     /** Where the picker stands, in this item's coordinates. */
     QRectF contentRectangle() const;
@@ -35,7 +33,6 @@ private:
 
     PresentationLayout m_layout;
     bool m_dark = false;
-    bool m_material = false;
 };
 
 } // namespace favrin::host

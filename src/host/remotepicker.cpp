@@ -222,7 +222,6 @@ void RemotePicker::followService()
 {
     const bool material = m_session->backgroundEffect() == remote::BackgroundEffect::ThickMaterial;
     m_presentation->setPreferredContentSize(m_session->preferredContentSize());
-    m_presentation->setMaterial(material);
     Q_EMIT preferredContentSizeChanged(m_session->preferredContentSize());
     Q_EMIT materialChanged(material);
 }
