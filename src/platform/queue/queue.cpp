@@ -3,69 +3,125 @@
 #include <QCoreApplication>
 #include <QThreadPool>
 
+#include <cstddef>
+#include <deque>
 #include <mutex>
 #include <utility>
-#include <vector>
 
 namespace favrin::platform {
 
 namespace {
 
+using Work = std::function<void()>;
+
+/**
+ * Work on its way to another thread. It lies behind a lock of its own, and only the word that there is some travels
+ * through the toolkit: tools that look for races know this lock, and not those of the toolkit.
+ */
+class WaitingWork
+{
+public:
+    void add(Work work)
+    {
+        const std::lock_guard guard(m_mutex);
+        m_work.push_back(std::move(work));
+    }
+
+    void runNext()
+    {
+        if (const Work work = next())
+            work();
+    }
+
+    void drop()
+    {
+        std::deque<Work> dropped;
+        const std::lock_guard guard(m_mutex);
+        // What is dropped goes after the lock: it may give more work when it goes.
+        dropped.swap(m_work);
+    }
+
+    std::size_t size()
+    {
+        const std::lock_guard guard(m_mutex);
+        return m_work.size();
+    }
+
+private:
+    Work next()
+    {
+        const std::lock_guard guard(m_mutex);
+        if (m_work.empty())
+            return {};
+        Work work = std::move(m_work.front());
+        m_work.pop_front();
+        return work;
+    }
+
+    std::mutex m_mutex;
+    std::deque<Work> m_work;
+};
+
 class MainQueue : public Queue
 {
 public:
-    void async(std::function<void()> work) override
+    void async(Work work) override
     {
         const std::lock_guard guard(m_mutex);
-        switch (m_phase) {
-        case Phase::BeforeApplication:
-            m_waiting.push_back(std::move(work));
-            break;
-        case Phase::Running:
-            post(std::move(work));
-            break;
-        case Phase::AfterApplication:
-            break;
-        }
+        if (m_phase == Phase::AfterApplication)
+            return;
+        m_waiting.add(std::move(work));
+        if (m_phase == Phase::Running)
+            post();
     }
 
     void applicationStarted()
     {
         const std::lock_guard guard(m_mutex);
         m_phase = Phase::Running;
-        for (auto &work : std::exchange(m_waiting, {}))
-            post(std::move(work));
+        for (std::size_t waiting = m_waiting.size(); waiting > 0; --waiting)
+            post();
     }
 
     void applicationEnds()
     {
-        const std::lock_guard guard(m_mutex);
-        m_phase = Phase::AfterApplication;
+        {
+            const std::lock_guard guard(m_mutex);
+            m_phase = Phase::AfterApplication;
+        }
+        m_waiting.drop();
     }
 
 private:
     enum class Phase { BeforeApplication, Running, AfterApplication };
 
     // The application object is the receiver: its thread is the main thread, and one receiver keeps the order.
-    static void post(std::function<void()> work)
+    void post()
     {
-        QMetaObject::invokeMethod(QCoreApplication::instance(), std::move(work), Qt::QueuedConnection);
+        QMetaObject::invokeMethod(
+            QCoreApplication::instance(), [this] { m_waiting.runNext(); }, Qt::QueuedConnection);
     }
 
     // Held while posting, so that the application cannot go away in between.
     std::mutex m_mutex;
     Phase m_phase = Phase::BeforeApplication;
-    std::vector<std::function<void()>> m_waiting;
+    WaitingWork m_waiting;
 };
 
 class BackgroundQueue : public Queue
 {
 public:
-    void async(std::function<void()> work) override
+    void async(Work work) override
     {
-        if (auto *pool = QThreadPool::globalInstance())
-            pool->start(std::move(work));
+        auto *pool = QThreadPool::globalInstance();
+        if (!pool)
+            return;
+        m_waiting.add(std::move(work));
+        pool->start([this] { m_waiting.runNext(); });
     }
+
+private:
+    WaitingWork m_waiting;
 };
 
 // Neither queue is ever destroyed: threads may still give work while the process ends.

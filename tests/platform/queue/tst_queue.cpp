@@ -5,9 +5,12 @@
 #include <QThread>
 #include <QtTest>
 
+#include <algorithm>
 #include <atomic>
 #include <memory>
+#include <numeric>
 #include <thread>
+#include <vector>
 
 using namespace favrin::platform;
 
@@ -89,6 +92,23 @@ private Q_SLOTS:
         });
         QTRY_COMPARE(back, qApp->thread());
         QVERIFY(worker.load() && worker.load() != back);
+    }
+
+    /** More work than threads: most of it is taken up by a thread that was busy when it was given. */
+    void whatWorkCarriesIsSeenByWhoeverRunsIt()
+    {
+        start();
+        constexpr int works = 200;
+        int returned = 0;
+        for (int number = 0; number < works; ++number) {
+            backgroundQueue().async([carried = std::vector<int>(16, number), &returned] {
+                const int sum = std::accumulate(carried.begin(), carried.end(), 0);
+                mainQueue().async([answer = std::vector<int>(16, sum), expected = 16 * carried.front(), &returned] {
+                    returned += std::ranges::count(answer, expected) == 16 ? 1 : 0;
+                });
+            });
+        }
+        QTRY_COMPARE(returned, works);
     }
 
     void workStillRunningWhenTheApplicationEndsDoesNoHarm()
