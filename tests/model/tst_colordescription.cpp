@@ -103,7 +103,6 @@ private Q_SLOTS:
     void names();
     void agreesWithTheSurvey();
     void wideColorsAreNamedFromTheirOwnSpace();
-    void opacityIsNotNamed();
     void everyColorHasALightness();
     void lighterNeverSoundsDarker();
     void anyPlatformColorHasAName();
@@ -180,9 +179,6 @@ void ColorDescriptionTest::agreesWithTheSurvey()
 
 void ColorDescriptionTest::wideColorsAreNamedFromTheirOwnSpace()
 {
-    QCOMPARE(nameOf(1, 0, 0, Space::displayP3), QStringLiteral("bright red"));
-    QCOMPARE(nameOf(0, 1, 0, Space::displayP3), QStringLiteral("bright green"));
-    QCOMPARE(nameOf(0.5, 0.5, 0.5, Space::displayP3), QStringLiteral("medium gray"));
     // Clipped to sRGB, some colors near the edge of Display P3 would get another name.
     int differing = 0;
     for (int i = 0; i < 11 * 11 * 11; ++i) {
@@ -195,12 +191,6 @@ void ColorDescriptionTest::wideColorsAreNamedFromTheirOwnSpace()
     QCOMPARE(nameOf(0.3, 0.5, 0.7),
              QString::fromStdString(model::colorDescription(
                  model::SomeColor(0.3, 0.5, 0.7, 1.0, Space::sRGB).inDisplayP3().platformColor())));
-}
-
-void ColorDescriptionTest::opacityIsNotNamed()
-{
-    const model::SomeColor red(1, 0, 0, 0.0, Space::sRGB);
-    QCOMPARE(model::colorDescription(red.platformColor()), std::string("bright red"));
 }
 
 void ColorDescriptionTest::everyColorHasALightness()

@@ -49,8 +49,6 @@ private Q_SLOTS:
     void comparesTolerantly_data();
     void comparesTolerantly();
     void equalsAndHashesExactly();
-    void setsOneField();
-    void namesAndRawValues();
 };
 
 void SomeColorTest::sameSpaceIsUntouched()
@@ -133,29 +131,6 @@ void SomeColorTest::equalsAndHashesExactly()
     QCOMPARE(hashOf(color), hashOf(color.setting(Component::b, -0.0)));
     QVERIFY(hashOf(color) != hashOf(SomeColor(0.2, 0.1, 0.0, 1.0, Space::sRGB)));
     QVERIFY(hashOf(color) != hashOf(SomeColor(0.1, 0.2, 0.0, 1.0, Space::displayP3)));
-}
-
-void SomeColorTest::setsOneField()
-{
-    const SomeColor color(0.1, 0.2, 0.3, 0.4, Space::displayP3);
-    QVERIFY(isSameBits(color.setting(Component::r, 5.0), SomeColor(5.0, 0.2, 0.3, 0.4, Space::displayP3)));
-    QVERIFY(isSameBits(color.setting(Component::g, -1.0), SomeColor(0.1, -1.0, 0.3, 0.4, Space::displayP3)));
-    QVERIFY(isSameBits(color.setting(Component::b, -0.0), SomeColor(0.1, 0.2, -0.0, 0.4, Space::displayP3)));
-    QVERIFY(isSameBits(color.setting(Component::a, 0.0), SomeColor(0.1, 0.2, 0.3, 0.0, Space::displayP3)));
-}
-
-void SomeColorTest::namesAndRawValues()
-{
-    QCOMPARE(model::platformName(Space::sRGB), std::string_view("kTQColorSpaceSRGB"));
-    QCOMPARE(model::platformName(Space::displayP3), std::string_view("kTQColorSpaceDisplayP3"));
-    QCOMPARE(model::colorSpaceFromPlatformName("kTQColorSpaceDisplayP3"), Space::displayP3);
-    QVERIFY(!model::colorSpaceFromPlatformName("kTQColorSpaceDisplayP3 ").has_value());
-    QVERIFY(!model::colorSpaceFromPlatformColorSpace(platform::ColorSpace::gray()).has_value());
-    QCOMPARE(model::displayName(Space::displayP3), std::string("Display P3"));
-    QCOMPARE(model::allColorSpaces.front(), Space::sRGB);
-    QCOMPARE(model::componentFromRawValue(3), Component::a);
-    QVERIFY(!model::componentFromRawValue(4).has_value());
-    QVERIFY(!model::componentFromRawValue(-1).has_value());
 }
 
 QTEST_APPLESS_MAIN(SomeColorTest)
