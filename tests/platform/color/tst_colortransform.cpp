@@ -56,7 +56,6 @@ private Q_SLOTS:
     void tintsOfDisplayP3ComeBackFull();
     void hasNoResult_data();
     void hasNoResult();
-    void transformsAreShared();
     void colorKeepsWhatItIsGiven();
     void spacesAreFoundByName();
 };
@@ -169,15 +168,6 @@ void ColorTransformTest::hasNoResult()
         QVERIFY(
             !ColorTransform::into(target)->convert(Color(std::nullopt, components, 1.0), RenderingIntent::Perceptual));
     }
-}
-
-void ColorTransformTest::transformsAreShared()
-{
-    QVERIFY(ColorTransform::into(colorspacename::sRGB));
-    QCOMPARE(ColorTransform::into(colorspacename::sRGB), ColorTransform::into(colorspacename::sRGB));
-    QVERIFY(!ColorTransform::into(colorspacename::extendedSRGB));
-    QVERIFY(!ColorTransform::into(colorspacename::gray));
-    QVERIFY(!ColorTransform::into("sRGB"));
 }
 
 void ColorTransformTest::colorKeepsWhatItIsGiven()

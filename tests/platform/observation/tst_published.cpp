@@ -50,17 +50,6 @@ private Q_SLOTS:
         QCOMPARE(takeLog(), QStringLiteral("will 1, first %1, stored 1, second %1, hook %1").arg(assigned));
     }
 
-    void onlyTheAssignedPropertyDelivers()
-    {
-        int announced = 0;
-        keep(m_owner->objectWillChange().sink([&](Nothing) { ++announced; }));
-        keep(m_owner->number.publisher().sink([this](int value) { note("number", value); }));
-        takeLog();
-        m_owner->text.set("b");
-        QCOMPARE(announced, 1);
-        QCOMPARE(takeLog(), QString());
-    }
-
     void innerAssignmentIsCompleteBeforeTheOuterGoesOn()
     {
         keep(m_owner->number.publisher().sink([this](int value) {

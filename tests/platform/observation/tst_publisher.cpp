@@ -131,17 +131,6 @@ private Q_SLOTS:
         b.send(3);
         QCOMPARE(log.join(u' '), QStringLiteral("12 13"));
     }
-
-    void mapPassesEveryValueThrough()
-    {
-        Subject<int> subject;
-        QStringList log;
-        const auto texts = subject.publisher().map([](int value) { return QString::number(value * 2); });
-        const auto subscription = texts.sink([&](const QString &value) { log << value; });
-        subject.send(2);
-        subject.send(2);
-        QCOMPARE(log.join(u' '), QStringLiteral("4 4"));
-    }
 };
 
 QTEST_APPLESS_MAIN(PublisherTest)

@@ -76,14 +76,6 @@ private Q_SLOTS:
         m_window.reset();
     }
 
-    void viewIsLoadedOnce()
-    {
-        QVERIFY(!m_parent->viewIfLoaded());
-        QQuickItem *view = m_parent->view();
-        QCOMPARE(m_parent->view(), view);
-        QCOMPARE(takeLog(), QStringLiteral("p load, p loaded"));
-    }
-
     void appearance_data()
     {
         QTest::addColumn<bool>("appearedBefore");
@@ -285,20 +277,6 @@ private Q_SLOTS:
         m_parent.reset();
         QVERIFY(!hadParent);
         QVERIFY(!childView);
-    }
-
-    void registryMakesWhatWasRegistered()
-    {
-        using namespace viewcontrollerregistry;
-        QVERIFY(!create("_Name"));
-        registerClass("_Name", [this] { return std::make_unique<Controller>(QStringLiteral("r"), m_log); });
-        const auto first = create("_Name");
-        const auto second = create("_Name");
-        QVERIFY(dynamic_cast<Controller *>(first.get()));
-        QVERIFY(second && second != first);
-        QVERIFY(!create("_name"));
-        registerClass("_Name", {});
-        QVERIFY(!create("_Name"));
     }
 
 private:
