@@ -37,8 +37,6 @@ class AccessibleSwatchGridTest : public QObject
 private Q_SLOTS:
     void initTestCase();
     void cellsAreNamedByTheirColor();
-    void selectedCellSaysSo();
-    void pressPicksFinally();
     void cellsAreFoundWhereTheyAre();
     void changesAreAnnounced();
     void cellsOutliveNothing();
@@ -70,38 +68,6 @@ void AccessibleSwatchGridTest::cellsAreNamedByTheirColor()
     }
     QCOMPARE(list->child(120), nullptr);
     QCOMPARE(list->child(-1), nullptr);
-}
-
-void AccessibleSwatchGridTest::selectedCellSaysSo()
-{
-    GridWindow grid;
-    QVERIFY(grid.isReady());
-    QAccessibleInterface *list = QAccessible::queryAccessibleInterface(grid.view);
-    const auto selectedCount = [list] {
-        int count = 0;
-        for (int index = 0; index < list->childCount(); ++index)
-            count += list->child(index)->state().selected ? 1 : 0;
-        return count;
-    };
-    QCOMPARE(selectedCount(), 0);
-    grid.state.selectedColor.set(swatch(4, 6));
-    QCOMPARE(selectedCount(), 1);
-    QVERIFY(list->child(4 * 12 + 6)->state().selected);
-    grid.state.selectedColor.set(swatch(4, 6).setting(model::SomeColor::Component::a, 0.5));
-    QCOMPARE(selectedCount(), 0);
-}
-
-void AccessibleSwatchGridTest::pressPicksFinally()
-{
-    GridWindow grid;
-    QVERIFY(grid.isReady());
-    grid.state.selectedColor.set(swatch(0, 0).setting(model::SomeColor::Component::a, 0.25));
-    int flags = -1; // The subscription itself delivers once.
-    const auto subscription = grid.state.isVolatile.publisher().sink([&flags](bool) { ++flags; });
-    QAccessibleInterface *cell = QAccessible::queryAccessibleInterface(grid.view)->child(12 + 3);
-    cell->actionInterface()->doAction(QAccessibleActionInterface::pressAction());
-    QCOMPARE(grid.state.selectedColor(), std::optional(swatch(1, 3).setting(model::SomeColor::Component::a, 0.25)));
-    QCOMPARE(flags, 0);
 }
 
 void AccessibleSwatchGridTest::cellsAreFoundWhereTheyAre()

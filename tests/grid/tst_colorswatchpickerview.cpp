@@ -30,7 +30,6 @@ private Q_SLOTS:
     void initTestCase();
     void init();
     void touchWritesFlagThenColor();
-    void mouseDragsBeyondTheEdges();
     void keysPickFinally();
     void firstKeyStartsNearTheColor();
     void pickKeepsSpaceAndOpacity();
@@ -68,17 +67,6 @@ void ColorSwatchPickerViewTest::touchWritesFlagThenColor()
     QTest::touchEvent(&grid.window, m_touch.get()).release(0, GridWindow::middle(5, 5));
     QCOMPARE(writes.take(), QStringLiteral("final"));
     QCOMPARE(grid.state.selectedColor(), std::optional(swatch(9, 0)));
-}
-
-void ColorSwatchPickerViewTest::mouseDragsBeyondTheEdges()
-{
-    GridWindow grid;
-    QVERIFY(grid.isReady());
-    Writes writes(grid.state);
-    QTest::mousePress(&grid.window, Qt::LeftButton, {}, GridWindow::middle(0, 0));
-    QTest::mouseMove(&grid.window, QPoint(399, 100));
-    QTest::mouseRelease(&grid.window, Qt::LeftButton, {}, QPoint(399, 100));
-    QCOMPARE(writes.take(), QStringLiteral("volatile 0,0 volatile 2,11 final"));
 }
 
 void ColorSwatchPickerViewTest::keysPickFinally()

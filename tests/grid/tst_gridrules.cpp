@@ -45,8 +45,6 @@ private Q_SLOTS:
     void markIgnoresOpacityAndSelectionDoesNot_data();
     void markIgnoresOpacityAndSelectionDoesNot();
     void firstOfEqualSwatchesIsMarked();
-    void cellsTileThePixels_data();
-    void cellsTileThePixels();
     void markerOutlineHasTwoRadii_data();
     void markerOutlineHasTwoRadii();
 };
@@ -177,29 +175,6 @@ void GridRulesTest::firstOfEqualSwatchesIsMarked()
     palette[6][2] = palette[8][1];
     palette[6][7] = palette[8][1];
     QCOMPARE(text(markedCell(palette[8][1], palette)), QStringLiteral("6,2"));
-}
-
-void GridRulesTest::cellsTileThePixels_data()
-{
-    QTest::addColumn<QSize>("size");
-    for (const QSize size : {QSize(328, 273), QSize(492, 410), QSize(656, 547), QSize(984, 820), QSize(7, 5)})
-        QTest::addRow("%dx%d", size.width(), size.height()) << size;
-}
-
-void GridRulesTest::cellsTileThePixels()
-{
-    QFETCH(QSize, size);
-    for (int row = 0; row < 10; ++row) {
-        for (int column = 0; column < 12; ++column) {
-            const QRect cell = cellPixels({row, column}, size);
-            QVERIFY(std::abs(cell.x() - size.width() * column / 12.0) <= 0.5);
-            QVERIFY(std::abs(cell.y() - size.height() * row / 10.0) <= 0.5);
-            const int right = column == 11 ? size.width() : cellPixels({row, column + 1}, size).x();
-            const int bottom = row == 9 ? size.height() : cellPixels({row + 1, column}, size).y();
-            QCOMPARE(cell.x() + cell.width(), right);
-            QCOMPARE(cell.y() + cell.height(), bottom);
-        }
-    }
 }
 
 void GridRulesTest::markerOutlineHasTwoRadii_data()
