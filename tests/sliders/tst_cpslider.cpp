@@ -42,7 +42,6 @@ private Q_SLOTS:
     void keysStepByWhatIsShown();
     void thumbFollowsTheColor();
     void assistiveTechnologiesStep();
-    void fieldsNarrowInLandscape();
 
 private:
     std::unique_ptr<QPointingDevice> m_touch{QTest::createTouchDevice()};
@@ -197,18 +196,6 @@ void CPSliderTest::assistiveTechnologiesStep()
     red->valueInterface()->setCurrentValue(QStringLiteral("x"));
     red->actionInterface()->doAction(QStringLiteral("x"));
     QCOMPARE(writes.take(), QString());
-}
-
-void CPSliderTest::fieldsNarrowInLandscape()
-{
-    SlidersWindow window;
-    QVERIFY(window.isReady());
-    const auto width = [&window](int field) { return window.input(field)->parentItem()->width(); };
-    QCOMPARE(width(0), 76.0);
-    window.state.useLandscapeLayout.set(true);
-    QCOMPARE(width(0), 70.0);
-    QCOMPARE(width(4), 70.0);
-    QCOMPARE(width(3), 100.0);
 }
 
 QTEST_MAIN(CPSliderTest)

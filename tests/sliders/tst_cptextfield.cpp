@@ -61,15 +61,11 @@ class CPTextFieldTest : public QObject
 
 private Q_SLOTS:
     void cleanup();
-    void everyKeystrokeIsWritten();
     void outOfRangeIsClampedAtOnce();
     void emptyTextWritesNothing();
-    void typingIsNeverVolatile();
     void fieldFollowsTheColorWhileEdited();
     void opacityKeepsTheCaretAtItsNumber();
     void opacityIsTypedOverItsSelection();
-    void hexIsWrittenWhenItIsWhole();
-    void hexTakesDigitsOnly();
     void hexKeepsItsTextWhileEdited();
     void hexKeepsTheSpace();
     void pasteBringsAColor_data();
@@ -81,27 +77,12 @@ private Q_SLOTS:
     void editingMakesTheFallbackASelection();
     void returnEndsEditing();
     void inputMethodIsFiltered();
-    void keyboardKinds();
     void doneBarOnAPhone();
-    void otherDigitsBecomeTheLocales();
 };
 
 void CPTextFieldTest::cleanup()
 {
     QGuiApplication::clipboard()->clear();
-}
-
-void CPTextFieldTest::everyKeystrokeIsWritten()
-{
-    SlidersWindow sliders;
-    QVERIFY(sliders.isReady());
-    const auto *input = begin(sliders, Red);
-    for (const auto &[key, value] : {std::pair('1', 1), {'2', 12}, {'8', 128}, {'8', 128}, {'x', 128}}) {
-        QTest::keyClick(&sliders.window, key);
-        QCOMPARE(color(sliders).r, value * unit);
-        QCOMPARE(text(input), QString::number(value));
-    }
-    QCOMPARE(color(sliders), SomeColor(128 * unit, 97 * unit, 253 * unit, 1.0, Space::sRGB));
 }
 
 void CPTextFieldTest::outOfRangeIsClampedAtOnce()
@@ -129,20 +110,6 @@ void CPTextFieldTest::emptyTextWritesNothing()
     QCOMPARE(color(sliders), before);
     begin(sliders, Red);
     QCOMPARE(text(input), QStringLiteral("253"));
-}
-
-void CPTextFieldTest::typingIsNeverVolatile()
-{
-    SlidersWindow sliders;
-    QVERIFY(sliders.isReady());
-    bool wasVolatile = false;
-    const auto subscription =
-        sliders.state.isVolatile.publisher().sink([&wasVolatile](bool flag) { wasVolatile |= flag; });
-    for (const Field field : {Red, Hex, Opacity}) {
-        begin(sliders, field);
-        type(sliders, "123");
-    }
-    QVERIFY(!wasVolatile);
 }
 
 void CPTextFieldTest::fieldFollowsTheColorWhileEdited()
@@ -187,31 +154,6 @@ void CPTextFieldTest::opacityIsTypedOverItsSelection()
     QCOMPARE(caret(input), 1);
     type(sliders, "5");
     QCOMPARE(color(sliders).a, 0.75);
-}
-
-void CPTextFieldTest::hexIsWrittenWhenItIsWhole()
-{
-    SlidersWindow sliders;
-    QVERIFY(sliders.isReady());
-    sliders.state.selectedColor.set(SomeColor(0.0, 0.0, 1.0, 0.3, Space::sRGB));
-    const SomeColor before = color(sliders);
-    const auto *input = begin(sliders, Hex);
-    type(sliders, "F0");
-    QCOMPARE(color(sliders), before);
-    type(sliders, "0");
-    QCOMPARE(color(sliders), SomeColor(1.0, 0.0, 0.0, 1.0, Space::sRGB));
-    QCOMPARE(text(input), QStringLiteral("F00"));
-    begin(sliders, Red);
-    QCOMPARE(text(input), QStringLiteral("FF0000"));
-}
-
-void CPTextFieldTest::hexTakesDigitsOnly()
-{
-    SlidersWindow sliders;
-    QVERIFY(sliders.isReady());
-    const auto *input = begin(sliders, Hex);
-    type(sliders, "#0g0 6zé1F;D7");
-    QCOMPARE(text(input), QStringLiteral("0061FD"));
 }
 
 void CPTextFieldTest::hexKeepsItsTextWhileEdited()
@@ -384,19 +326,6 @@ void CPTextFieldTest::inputMethodIsFiltered()
     QCOMPARE(color(sliders).r, 123 * unit);
 }
 
-void CPTextFieldTest::keyboardKinds()
-{
-    SlidersWindow sliders;
-    QVERIFY(sliders.isReady());
-    const auto hints = [&sliders](Field field) {
-        return Qt::InputMethodHints(sliders.input(field)->property("inputMethodHints").toInt());
-    };
-    for (const Field field : {Red, Green, Blue, Opacity})
-        QVERIFY(hints(field).testFlag(Qt::ImhDigitsOnly));
-    QVERIFY(hints(Hex).testFlag(Qt::ImhLatinOnly));
-    QVERIFY(!hints(Hex).testFlag(Qt::ImhDigitsOnly));
-}
-
 void CPTextFieldTest::doneBarOnAPhone()
 {
     SlidersWindow sliders;
@@ -419,16 +348,6 @@ void CPTextFieldTest::doneBarOnAPhone()
     QVERIFY(done);
     QTest::mouseClick(&sliders.window, Qt::LeftButton, {}, SlidersWindow::at(done, done->width() / 2));
     QVERIFY(!red->hasActiveFocus());
-}
-
-void CPTextFieldTest::otherDigitsBecomeTheLocales()
-{
-    SlidersWindow sliders;
-    QVERIFY(sliders.isReady());
-    const auto *input = begin(sliders, Red);
-    paste(sliders, QStringLiteral("१२"));
-    QCOMPARE(color(sliders).r, 12 * unit);
-    QCOMPARE(text(input), QStringLiteral("12"));
 }
 
 QTEST_MAIN(CPTextFieldTest)

@@ -26,7 +26,6 @@ private Q_SLOTS:
     void stopsAreTheEndsOfTheComponent();
     void keysMeanValues_data();
     void keysMeanValues();
-    void checkerboardCoversTheArea();
 };
 
 void SliderRulesTest::locationsMeanValues_data()
@@ -116,23 +115,6 @@ void SliderRulesTest::keysMeanValues()
     QTEST(valueForKey(key, {}, value, 255, Qt::LeftToRight), "leftToRight");
     QTEST(valueForKey(key, {}, value, 255, Qt::RightToLeft), "rightToLeft");
     QCOMPARE(valueForKey(key, Qt::ControlModifier, value, 255, Qt::LeftToRight), Value());
-}
-
-void SliderRulesTest::checkerboardCoversTheArea()
-{
-    const SomeColor squareColor(0.851, 0.847, 0.855, 1.0, Space::displayP3);
-    OpacityBackground background = {12.0, squareColor, service::ColorScheme::Light};
-    QCOMPARE(background.squareCount(236.0), 20);
-    QCOMPARE(background.squareCount(36.0), 4);
-    QCOMPARE(background.squareCount(5.0), 3);
-    const SomeColor white(1.0, 1.0, 1.0, 1.0, Space::sRGB);
-    QCOMPARE(background.color(0, 0), squareColor);
-    QCOMPARE(background.color(0, 1), white);
-    QCOMPARE(background.color(1, 0), white);
-    QCOMPARE(background.color(1, 1), squareColor);
-    background.colorScheme = service::ColorScheme::Dark;
-    QCOMPARE(background.color(0, 0), squareColor);
-    QCOMPARE(background.color(0, 1), SomeColor(0.0, 0.0, 0.0, 1.0, Space::sRGB));
 }
 
 QTEST_APPLESS_MAIN(SliderRulesTest)
