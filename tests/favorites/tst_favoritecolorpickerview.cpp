@@ -19,7 +19,6 @@ private Q_SLOTS:
     void tapPicksTheColorOfTheItem();
     void tapOnTheAddButtonAppends();
     void tapOnTheRemoveButtonClears();
-    void tapBetweenTheCellsDoesNothing();
     void everyWayOfDeletingDeletes_data();
     void everyWayOfDeletingDeletes();
     void whatIsNoFavoriteIsNotDeleted();
@@ -30,11 +29,9 @@ private Q_SLOTS:
     void swipeTurnsOnePage();
     void indicatorTurnsPages();
     void pendingPageIsSnappedTo();
-    void indicatorNamesThePageFarOut();
     void keysMoveAndPick();
     void keysTurnPages();
     void keysAreMirrored();
-    void stripIsOneTabStop();
     void pageStaysInViewWhenTheLayoutChanges();
     void lastPageGoesWithItsLastItem();
     void mirroredStripKeepsItsPageWhenAPageIsAdded();
@@ -124,14 +121,6 @@ void FavoriteColorPickerViewTest::tapOnTheRemoveButtonClears()
     QCOMPARE(strip.state.fallbackColor(), SomeColor(0.0, 0.0, 0.0, 1.0, SomeColor::ColorSpace::displayP3));
     QTRY_COMPARE(strip.count(), 3);
     QCOMPARE(strip.cells().selectedPlaces(), std::vector{0});
-}
-
-void FavoriteColorPickerViewTest::tapBetweenTheCellsDoesNothing()
-{
-    FavoritesWindow strip;
-    QVERIFY(strip.show());
-    QTest::mouseClick(&strip.window, Qt::LeftButton, {}, (strip.middle(0) + strip.middle(1)) / 2);
-    QVERIFY(!strip.state.hasSelectedColor());
 }
 
 void FavoriteColorPickerViewTest::everyWayOfDeletingDeletes_data()
@@ -320,18 +309,6 @@ void FavoriteColorPickerViewTest::pendingPageIsSnappedTo()
     QCOMPARE(strip.middle(36), QPoint(15 + 15, 115));
 }
 
-void FavoriteColorPickerViewTest::indicatorNamesThePageFarOut()
-{
-    FavoritesWindow strip(10'000);
-    QVERIFY(strip.show());
-    for (int page : {9, 10, 11, 60, 833}) {
-        strip.model->pageControlPendingPage.set(page);
-        QTRY_COMPARE(strip.page(), page);
-        QCOMPARE(strip.middle(page * 12), QPoint(15 + 15, 115));
-        QCOMPARE(strip.pageControl->currentPage(), page);
-    }
-}
-
 void FavoriteColorPickerViewTest::keysMoveAndPick()
 {
     FavoritesWindow strip(9);
@@ -390,17 +367,6 @@ void FavoriteColorPickerViewTest::keysAreMirrored()
     QCOMPARE(strip.state.selectedColor(), std::optional(strip.state.favoriteColors()[1]));
     QTest::mouseClick(&strip.window, Qt::LeftButton, {}, QPoint(300 - 30 - 2 * 48, 115));
     QCOMPARE(strip.state.selectedColor(), std::optional(strip.state.favoriteColors()[2]));
-}
-
-void FavoriteColorPickerViewTest::stripIsOneTabStop()
-{
-    FavoritesWindow strip(40);
-    QVERIFY(strip.show());
-    strip.strip->forceActiveFocus(Qt::TabFocusReason);
-    QTest::keyClick(&strip.window, Qt::Key_Tab);
-    QCOMPARE(strip.window.activeFocusItem(), strip.strip);
-    QTest::keyClick(&strip.window, Qt::Key_Backtab, Qt::ShiftModifier);
-    QCOMPARE(strip.window.activeFocusItem(), strip.strip);
 }
 
 void FavoriteColorPickerViewTest::pageStaysInViewWhenTheLayoutChanges()
