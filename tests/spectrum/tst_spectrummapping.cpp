@@ -66,10 +66,7 @@ class SpectrumMappingTest : public QObject
 private Q_SLOTS:
     void locationHasColor_data();
     void locationHasColor();
-    void colorIsOpaqueExtendedSRGB();
     void fieldKeepsItsBits();
-    void edgesArePure();
-    void hueRunsOnce();
     void angleOfColor_data();
     void angleOfColor();
     void positionOfColor_data();
@@ -105,39 +102,10 @@ void SpectrumMappingTest::locationHasColor()
     QVERIFY(isNear(colorAt(location.x(), location.y()), color));
 }
 
-void SpectrumMappingTest::colorIsOpaqueExtendedSRGB()
-{
-    const platform::Color color = SpectrumRenderer::colorAtLocation({0.25, -0.6});
-    QCOMPARE(color.colorSpace(), std::optional(platform::ColorSpace::extendedSRGB()));
-    QCOMPARE(color.alpha(), 1.0);
-}
-
 void SpectrumMappingTest::fieldKeepsItsBits()
 {
     // Taken from these very operations computed one by one in single precision by another program.
     QCOMPARE(bitsOfTheField(), quint64(0x742dad70c90f4462));
-}
-
-void SpectrumMappingTest::edgesArePure()
-{
-    for (int i = -100; i <= 100; ++i) {
-        QCOMPARE(colorAt(-1.0, i / 100.0), (FieldColor{1.0F, 1.0F, 1.0F}));
-        QVERIFY(isNear(colorAt(1.0, i / 100.0), {0.0F, 0.0F, 0.0F}));
-    }
-}
-
-void SpectrumMappingTest::hueRunsOnce()
-{
-    float previous = -1.0F;
-    for (int i = 0; i <= 1000; ++i) {
-        const FieldColor color = hueColor(1.0F - static_cast<float>(i) / 500.0F);
-        QCOMPARE(std::max({color.r, color.g, color.b}), 1.0F);
-        QCOMPARE(std::min({color.r, color.g, color.b}), 0.0F);
-        const float angle = hueAngle(color.r, color.g, color.b);
-        QVERIFY2(angle >= previous && angle < 360.0F, qPrintable(QString::number(i)));
-        previous = angle;
-    }
-    QVERIFY(previous > 359.0F);
 }
 
 void SpectrumMappingTest::angleOfColor_data()

@@ -49,13 +49,11 @@ public:
     void submit(std::vector<RenderPass> passes, CompletedHandler completed) override
     {
         ++frames;
-        last = passes;
         CpuDevice::submit(std::move(passes), std::move(completed));
     }
 
     bool compiles = true;
     int frames = 0;
-    std::vector<RenderPass> last;
 };
 
 /** A view of a size in points, set up as the spectrum sets it up, in a window that is shown. */
@@ -119,15 +117,11 @@ private Q_SLOTS:
     void everyPixelIsTheMappings_data();
     void everyPixelIsTheMappings();
     void sizeChangeDrawsOnce();
-    void onePassOfSixVerticesIsDrawn();
     void whatIsMissingSkipsTheFrame_data();
     void whatIsMissingSkipsTheFrame();
-    void missingFunctionMakesNoPipeline_data();
     void missingFunctionMakesNoPipeline();
 
 private:
-    void addDevices();
-
     Complaints m_complaints;
     std::shared_ptr<Device> m_processor = std::make_shared<cpu::CpuDevice>();
     std::shared_ptr<Device> m_vulkan;
@@ -154,13 +148,6 @@ void SpectrumRendererTest::cleanupTestCase()
     // The layer complains of what is left when the device goes.
     m_vulkan.reset();
     QCOMPARE(m_complaints.text(), QString());
-}
-
-void SpectrumRendererTest::addDevices()
-{
-    QTest::addColumn<bool>("byVulkan");
-    QTest::newRow("processor") << false;
-    QTest::newRow("Vulkan") << true;
 }
 
 void SpectrumRendererTest::everyPixelIsTheMappings_data()
@@ -225,22 +212,6 @@ void SpectrumRendererTest::sizeChangeDrawsOnce()
     QCOMPARE(device->frames, 2);
 }
 
-void SpectrumRendererTest::onePassOfSixVerticesIsDrawn()
-{
-    const auto device = std::make_shared<CountingDevice>();
-    ViewWindow window({40.0, 30.0});
-    const SpectrumRenderer renderer(*window.view, device);
-    QTRY_COMPARE(device->frames, 1);
-    QCOMPARE(device->last.size(), std::size_t(1));
-    const RenderPass &pass = device->last.front();
-    const ClearColor clear = pass.descriptor.colorAttachments[0].clearColor;
-    QCOMPARE(clear.red + clear.green + clear.blue + clear.alpha, 0.0);
-    QCOMPARE(pass.draws.size(), std::size_t(1));
-    QCOMPARE(pass.draws.front().vertexStart, 0U);
-    QCOMPARE(pass.draws.front().vertexCount, 6U);
-    QCOMPARE(pass.draws.front().pipelineState, renderer.pipelineState());
-}
-
 void SpectrumRendererTest::whatIsMissingSkipsTheFrame_data()
 {
     QTest::addColumn<QString>("missing");
@@ -270,18 +241,11 @@ void SpectrumRendererTest::whatIsMissingSkipsTheFrame()
         QVERIFY(!renderer.pipelineState());
 }
 
-void SpectrumRendererTest::missingFunctionMakesNoPipeline_data()
-{
-    addDevices();
-}
-
 void SpectrumRendererTest::missingFunctionMakesNoPipeline()
 {
-    QFETCH(bool, byVulkan);
-    if (byVulkan && !m_vulkan)
+    if (!m_vulkan)
         QSKIP(m_reason.c_str());
-    Device &device = byVulkan ? *m_vulkan : *m_processor;
-    const auto library = device.makeDefaultLibrary();
+    const auto library = m_vulkan->makeDefaultLibrary();
     QVERIFY(library->makeFunction("vertexShader"));
     QCOMPARE(library->makeFunction("noShader"), nullptr);
     RenderPipelineDescriptor descriptor;
@@ -289,7 +253,7 @@ void SpectrumRendererTest::missingFunctionMakesNoPipeline()
     descriptor.vertexDescriptor.floatsPerVertex = 2;
     descriptor.colorAttachments[0].pixelFormat = PixelFormat::BGRA8Unorm;
     std::string error;
-    QCOMPARE(device.makeRenderPipelineState(descriptor, &error), nullptr);
+    QCOMPARE(m_vulkan->makeRenderPipelineState(descriptor, &error), nullptr);
     QVERIFY(!error.empty());
 }
 
