@@ -73,7 +73,6 @@ private Q_SLOTS:
     void tabsComeFromTheirExactRawStringsOnly_data();
     void tabsComeFromTheirExactRawStringsOnly();
     void theCloseActionMayEndTheState();
-    void anAnimatedChangeIsMarkedWhileItIsMade();
 };
 
 void TestColorPickerState::anAssignmentIsAnnouncedThenDeliveredThenStored()
@@ -181,18 +180,6 @@ void TestColorPickerState::theCloseActionMayEndTheState()
     state->close.set([&state] { state.reset(); });
     state->performClose();
     QVERIFY(!state);
-}
-
-void TestColorPickerState::anAnimatedChangeIsMarkedWhileItIsMade()
-{
-    ColorPickerState state({});
-    bool markedWhenSignalled = false;
-    connect(&state, &ColorPickerState::selectedColorChanged, &state,
-            [&] { markedWhenSignalled = state.animatesChanges(); });
-    state.withAnimation([&] { state.selectedColor.set(red); });
-    QVERIFY(markedWhenSignalled);
-    state.selectedColor.set(blue);
-    QVERIFY(!markedWhenSignalled);
 }
 
 QTEST_GUILESS_MAIN(TestColorPickerState)

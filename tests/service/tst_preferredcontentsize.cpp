@@ -16,8 +16,6 @@ private Q_SLOTS:
     void theHeightIsTheViewsOrElseTheWindows();
     void changesOfLessThanFifteenPointsAreDropped_data();
     void changesOfLessThanFifteenPointsAreDropped();
-    void lengthsFromOutsideAreMadeSane_data();
-    void lengthsFromOutsideAreMadeSane();
 };
 
 void TestPreferredContentSize::wideWindowsAreLandscapeExceptInAPopover_data()
@@ -82,23 +80,6 @@ void TestPreferredContentSize::changesOfLessThanFifteenPointsAreDropped()
 {
     QFETCH(QSizeF, wantedSize);
     QTEST(isWorthChanging(QSizeF(360, 500), wantedSize), "changes");
-}
-
-void TestPreferredContentSize::lengthsFromOutsideAreMadeSane_data()
-{
-    QTest::addColumn<double>("length");
-    QTest::addColumn<double>("sane");
-    QTest::newRow("ordinary") << 300.5 << 300.5;
-    QTest::newRow("negative") << -3.0 << 0.0;
-    QTest::newRow("not a number") << qQNaN() << 0.0;
-    QTest::newRow("infinite") << qInf() << 0.0;
-    QTest::newRow("absurd") << 1e300 << 16384.0;
-}
-
-void TestPreferredContentSize::lengthsFromOutsideAreMadeSane()
-{
-    QFETCH(double, length);
-    QTEST(saneLength(length), "sane");
 }
 
 QTEST_GUILESS_MAIN(TestPreferredContentSize)

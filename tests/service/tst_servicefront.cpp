@@ -84,9 +84,7 @@ private Q_SLOTS:
     void init();
     void cleanup();
 
-    void theHostsColorComesThroughAndIsNotEchoed();
     void picksCarryTheNameOfTheirSpace();
-    void bothEndsOfThePresentationReachTheHost();
     void aConfigurationBeforeTheViewIsNotLost();
     void preparingIsAnsweredAtOnce();
     void thePreferredSizeFollowsWindowAndView();
@@ -165,14 +163,6 @@ void TestServiceFront::setPresentationContext(platform::PresentationContext cont
     m_front->setTraits(traits);
 }
 
-void TestServiceFront::theHostsColorComesThroughAndIsNotEchoed()
-{
-    m_front->setSelectedColor(wideGreen.platformColor(), displayP3Name);
-    QVERIFY(state().selectedColor() == wideGreen);
-    m_front->setConfiguration({});
-    QVERIFY(m_host.picks.empty());
-}
-
 void TestServiceFront::picksCarryTheNameOfTheirSpace()
 {
     state().isVolatile.set(true);
@@ -185,13 +175,6 @@ void TestServiceFront::picksCarryTheNameOfTheirSpace()
                                                             {green, displayP3Name, true},
                                                             {green, displayP3Name, false},
                                                             {std::nullopt, std::nullopt, false}}));
-}
-
-void TestServiceFront::bothEndsOfThePresentationReachTheHost()
-{
-    state().performClose();
-    m_front->colorPickerDidFinish();
-    QCOMPARE(m_host.messages, words("finish, finish"));
 }
 
 void TestServiceFront::aConfigurationBeforeTheViewIsNotLost()
