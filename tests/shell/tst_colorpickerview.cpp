@@ -13,8 +13,6 @@ private Q_SLOTS:
     void cleanup() { theme::Theme::instance().setLayoutDirection(Qt::LeftToRight); }
     void everyWayOfClosingCloses_data();
     void everyWayOfClosingCloses();
-    void hiddenCloseButtonKeepsItsRoom_data();
-    void hiddenCloseButtonKeepsItsRoom();
     void longTitleStaysBetweenTheButtons();
     void titleIsPlainText();
     void mirroredExceptTheGrid();
@@ -63,31 +61,6 @@ void ColorPickerViewTest::everyWayOfClosingCloses()
                                                            : Qt::Key_Escape);
     }
     QCOMPARE(picker.closed, 1);
-}
-
-void ColorPickerViewTest::hiddenCloseButtonKeepsItsRoom_data()
-{
-    QTest::addColumn<bool>("popover");
-    QTest::addColumn<bool>("embedded");
-    QTest::newRow("popover") << true << false;
-    QTest::newRow("embedded") << false << true;
-}
-
-void ColorPickerViewTest::hiddenCloseButtonKeepsItsRoom()
-{
-    QFETCH(bool, popover);
-    QFETCH(bool, embedded);
-    PickerWindow picker;
-    QVERIFY(picker.isReady());
-    QQuickItem *button = picker.item(QStringLiteral("Close"));
-    const QRectF title = PickerWindow::inWindow(picker.item(QStringLiteral("Colors")));
-    picker.state.isPopover.set(popover);
-    picker.state.isEmbedded.set(embedded);
-    QCOMPARE(button->opacity(), 0.0);
-    QTest::mouseClick(&picker.window, Qt::LeftButton, {}, PickerWindow::inWindow(button).center().toPoint());
-    QCOMPARE(picker.closed, 0);
-    QVERIFY(!button->hasActiveFocus());
-    QCOMPARE(PickerWindow::inWindow(picker.item(QStringLiteral("Colors"))), title);
 }
 
 void ColorPickerViewTest::longTitleStaysBetweenTheButtons()

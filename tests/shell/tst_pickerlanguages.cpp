@@ -8,6 +8,8 @@
 #include <QDir>
 #include <QLocale>
 
+#include <algorithm>
+
 using namespace favrin;
 using service::Tab;
 using theme::TextSizeCategory;
@@ -31,6 +33,14 @@ std::vector<model::SomeColor> colors(int count)
     return colors;
 }
 
+QList<QQuickItem *> itemsBelow(const QQuickItem *item)
+{
+    QList<QQuickItem *> items;
+    for (auto *child : item->childItems())
+        items << child << itemsBelow(child);
+    return items;
+}
+
 } // namespace
 
 /** The whole picker in other languages. */
@@ -43,6 +53,7 @@ private Q_SLOTS:
     void cleanup();
     void everyTextIsTranslatedAndFits_data();
     void everyTextIsTranslatedAndFits();
+    void textsOfMenusAreTranslatedAndFit();
     void everyLanguageFits_data();
     void everyLanguageFits();
     void anotherLanguageTakesEffectAtOnce();
@@ -89,6 +100,40 @@ void PickerLanguagesTest::everyTextIsTranslatedAndFits()
         QCOMPARE(clippedTexts(*picker.view).join(u'\n'), QString());
         QCOMPARE(untranslatedSpeech(*picker.view).join(u'\n'), QString());
     }
+    // Nothing passed because nothing was seen: all of it, swatches too, is in the language that is looked for.
+    picker.state.selectedTab.set(Tab::grid);
+    platform::setStringTable({});
+    QVERIFY(untranslatedSpeech(*picker.view).size() >= 120);
+}
+
+void PickerLanguagesTest::textsOfMenusAreTranslatedAndFit()
+{
+    platform::installTranslations(u"en-XA");
+    PickerWindow picker(QSize(360, 700), colors(30), prepare);
+    picker.state.selectedTab.set(Tab::sliders);
+    QVERIFY(picker.isReady());
+    const QQuickItem *scene = picker.window.contentItem();
+    const auto menuItems = [scene] {
+        return std::ranges::count_if(itemsBelow(scene), [](const QQuickItem *item) {
+            return item->inherits("QQuickMenuItem") && item->isVisible();
+        });
+    };
+    const auto checkTexts = [scene] {
+        QCOMPARE(untranslatedTexts(*scene).join(u'\n'), QString());
+        QCOMPARE(clippedTexts(*scene).join(u'\n'), QString());
+    };
+    for (QQuickItem *item : itemsBelow(scene)) {
+        if (QByteArray(item->metaObject()->className()).startsWith("ColorSpaceButton"))
+            QMetaObject::invokeMethod(item, "clicked");
+    }
+    QTRY_COMPARE(menuItems(), 2);
+    checkTexts();
+    QTest::keyClick(&picker.window, Qt::Key_Escape);
+    QTRY_COMPARE(menuItems(), 0);
+    auto *strip = picker.itemOf<favorites::FavoriteColorPickerView>();
+    strip->showDeleteCallout(strip->collectionView()->frame(1).center());
+    QTRY_COMPARE(menuItems(), 1);
+    checkTexts();
 }
 
 void PickerLanguagesTest::everyLanguageFits_data()

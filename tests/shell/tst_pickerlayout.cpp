@@ -140,16 +140,23 @@ void PickerLayoutTest::titleStaysWhereButtonsAreHidden()
     const auto title = [&] { return PickerWindow::inWindow(picker.item(QStringLiteral("Colors"))); };
     const QRectF before = title();
     const QRectF eyedropper = PickerWindow::inWindow(picker.item(QStringLiteral("Eyedropper_Accessibility")));
-    const QRectF close = PickerWindow::inWindow(picker.item(QStringLiteral("Close")));
+    const QQuickItem *closeButton = picker.item(QStringLiteral("Close"));
+    const QRectF close = PickerWindow::inWindow(closeButton);
     QCOMPARE(eyedropper.left(), 16.0);
     QCOMPARE(close.right(), 344.0);
     // The same room on either side of the title.
     QVERIFY(std::abs((before.left() - eyedropper.right()) - (close.left() - before.right())) <= 1.0);
     picker.state.showsEyedropper.set(false);
-    picker.state.isEmbedded.set(true);
-    QCOMPARE(title(), before);
-    QTest::mouseClick(&picker.window, Qt::LeftButton, {}, eyedropper.center().toPoint());
-    QVERIFY(!picker.state.eyedropperShowing());
+    for (auto *hides : {&picker.state.isEmbedded, &picker.state.isPopover}) {
+        hides->set(true);
+        QCOMPARE(title(), before);
+        for (const QRectF &button : {eyedropper, close})
+            QTest::mouseClick(&picker.window, Qt::LeftButton, {}, button.center().toPoint());
+        QVERIFY(!picker.state.eyedropperShowing());
+        QCOMPARE(picker.closed, 0);
+        QVERIFY(!closeButton->hasActiveFocus() && closeButton->opacity() == 0.0);
+        hides->set(false);
+    }
 }
 
 void PickerLayoutTest::slidersTakeTheAreaOfTheOtherTabs_data()

@@ -1,60 +1,19 @@
 #include "support/pseudolocale.h"
 
-#include "../favorites/favoriteswindow.h"
-#include "../grid/gridwindow.h"
-#include "../sliders/sliderswindow.h"
-#include "model/axcolordescription.h"
-#include "platform/strings/localizedstring.h"
-#include "platform/strings/translationtable.h"
-
-#include <QAccessible>
-#include <QLocale>
-
-using favrin::model::ColorNamingReadiness;
-using favrin::platform::installTranslations;
-using favrin::theme::TextSizeCategory;
-using favrin::theme::Theme;
-
-namespace {
-
-bool isMenuShown(const QQuickItem *scene)
-{
-    const auto items = itemsBelow(scene);
-    return std::any_of(items.begin(), items.end(),
-                       [](const QQuickItem *item) { return item->inherits("QQuickMenuItem") && item->isVisible(); });
-}
-
-} // namespace
+#include <QQmlComponent>
+#include <QQmlEngine>
+#include <QQuickItem>
+#include <QQuickWindow>
+#include <QTest>
 
 class PseudolocaleTest : public QObject
 {
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase();
-    void cleanup();
     void findsTexts_data();
     void findsTexts();
-    void slidersAreTranslated_data();
-    void slidersAreTranslated();
-    void textsAreLookedAt();
-    void gridIsTranslated();
-    void favoritesAreTranslated();
 };
-
-void PseudolocaleTest::initTestCase()
-{
-    QLocale::setDefault(QLocale(QStringLiteral("en-XA")));
-    QAccessible::setActive(true);
-    // Names of colors are spoken at once.
-    ColorNamingReadiness::process().becomeReady();
-}
-
-void PseudolocaleTest::cleanup()
-{
-    favrin::platform::setStringTable({});
-    Theme::instance().setTextSizeCategory(TextSizeCategory::Large);
-}
 
 void PseudolocaleTest::findsTexts_data()
 {
@@ -104,67 +63,6 @@ void PseudolocaleTest::findsTexts()
     QVERIFY(QTest::qWaitForWindowExposed(&window));
     QTEST(static_cast<int>(untranslatedTexts(*root).size()), "untranslated");
     QTEST(static_cast<int>(clippedTexts(*root).size()), "clipped");
-}
-
-void PseudolocaleTest::slidersAreTranslated_data()
-{
-    QTest::addColumn<TextSizeCategory>("size");
-    QTest::newRow("usual text") << TextSizeCategory::Large;
-    QTest::newRow("large text") << TextSizeCategory::ExtraExtraExtraLarge;
-}
-
-void PseudolocaleTest::slidersAreTranslated()
-{
-    QFETCH(TextSizeCategory, size);
-    QCOMPARE(installTranslations(u"en-XA"), QStringLiteral("en-XA"));
-    Theme::instance().setTextSizeCategory(size);
-    SlidersWindow sliders;
-    QVERIFY(sliders.isReady());
-    auto *scene = sliders.window.contentItem();
-    for (auto *item : itemsBelow(scene)) {
-        if (QByteArray(item->metaObject()->className()).startsWith("ColorSpaceButton"))
-            QMetaObject::invokeMethod(item, "clicked");
-    }
-    QTRY_VERIFY(isMenuShown(scene));
-    QCOMPARE(untranslatedTexts(*scene), QStringList());
-    QCOMPARE(clippedTexts(*scene), QStringList());
-    QCOMPARE(untranslatedSpeech(*sliders.view), QStringList());
-}
-
-void PseudolocaleTest::textsAreLookedAt()
-{
-    // Nothing above passes because nothing was seen.
-    SlidersWindow sliders;
-    QVERIFY(sliders.isReady());
-    QCOMPARE(untranslatedTexts(*sliders.view).size(), 5);
-    QVERIFY(untranslatedSpeech(*sliders.view).size() >= 5);
-    sliders.view->setWidth(60);
-    QVERIFY(!clippedTexts(*sliders.view).isEmpty());
-}
-
-void PseudolocaleTest::gridIsTranslated()
-{
-    installTranslations(u"en-XA");
-    GridWindow grid;
-    QVERIFY(grid.isReady());
-    QCOMPARE(untranslatedTexts(*grid.view), QStringList());
-    QCOMPARE(untranslatedSpeech(*grid.view), QStringList());
-    // The names of all swatches were read, and in the language that is looked for.
-    favrin::platform::setStringTable({});
-    QVERIFY(untranslatedSpeech(*grid.view).size() >= 120);
-}
-
-void PseudolocaleTest::favoritesAreTranslated()
-{
-    installTranslations(u"en-XA");
-    FavoritesWindow favorites(30);
-    QVERIFY(favorites.show());
-    favorites.strip->forceActiveFocus();
-    favorites.strip->showDeleteCallout(favorites.cells().frame(0).center());
-    QTRY_VERIFY(isMenuShown(favorites.window.contentItem()));
-    QCOMPARE(untranslatedTexts(*favorites.window.contentItem()), QStringList());
-    QCOMPARE(clippedTexts(*favorites.window.contentItem()), QStringList());
-    QCOMPARE(untranslatedSpeech(*favorites.root), QStringList());
 }
 
 QTEST_MAIN(PseudolocaleTest)
