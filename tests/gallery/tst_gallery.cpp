@@ -1,9 +1,7 @@
 #include "apps/gallery/galleryoptions.h"
 #include "apps/gallery/messagelog.h"
 #include "apps/gallery/pickrecorder.h"
-#include "apps/gallery/postershape.h"
 
-#include <QPainter>
 #include <QTest>
 
 using namespace favrin::gallery;
@@ -16,8 +14,6 @@ private Q_SLOTS:
     void picksAreWrittenWithoutLoss_data();
     void picksAreWrittenWithoutLoss();
     void logKeepsTheNewestMessages();
-    void pointsOfThePosterBelongToParts_data();
-    void pointsOfThePosterBelongToParts();
     void commandLineIsUnderstood_data();
     void commandLineIsUnderstood();
 };
@@ -60,34 +56,6 @@ void GalleryTest::logKeepsTheNewestMessages()
     QCOMPARE(newest.data(MessageLog::NumberRole).toInt(), messages);
     QCOMPARE(newest.data(MessageLog::KindRole).value<MessageLog::Kind>(), MessageLog::Kind::FinalPick);
     QCOMPARE(log.index(log.rowCount() - 1).data(MessageLog::NumberRole).toInt(), 4);
-}
-
-void GalleryTest::pointsOfThePosterBelongToParts_data()
-{
-    QTest::addColumn<Poster::Part>("part");
-    QTest::addColumn<QPointF>("point");
-    QTest::addColumn<bool>("inside");
-
-    QTest::newRow("the sun's middle") << Poster::Part::Sun << QPointF(392, 300) << true;
-    QTest::newRow("a slit of the sun") << Poster::Part::Sun << QPointF(392, 368) << false;
-    QTest::newRow("the sun behind the hills") << Poster::Part::Sun << QPointF(392, 492) << false;
-    QTest::newRow("its reflection") << Poster::Part::Sun << QPointF(392, 582) << true;
-    QTest::newRow("a hill") << Poster::Part::Hills << QPointF(60, 500) << true;
-    QTest::newRow("the sky above it") << Poster::Part::Hills << QPointF(60, 300) << false;
-    QTest::newRow("the water") << Poster::Part::Water << QPointF(300, 800) << true;
-    QTest::newRow("the paper's edge") << Poster::Part::Paper << QPointF(1, 839) << true;
-    QTest::newRow("beside the paper") << Poster::Part::Paper << QPointF(601, 400) << false;
-}
-
-void GalleryTest::pointsOfThePosterBelongToParts()
-{
-    QFETCH(Poster::Part, part);
-    QFETCH(QPointF, point);
-    PosterShape shape;
-    shape.setPart(part);
-    QVERIFY(!shape.contains(point)); // Without a size there is nothing to touch.
-    shape.setSize(QSizeF(300, 420));
-    QTEST(shape.contains(point / 2), "inside");
 }
 
 void GalleryTest::commandLineIsUnderstood_data()
