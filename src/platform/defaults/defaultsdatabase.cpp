@@ -1,5 +1,7 @@
 #include "platform/defaults/defaultsdatabase.h"
 
+#include "platform/defaults/boundedwait.h"
+
 #include <sqlite3.h>
 #include <sys/stat.h>
 
@@ -51,8 +53,9 @@ std::unique_ptr<DefaultsDatabase> DefaultsDatabase::open(const std::filesystem::
     database->m_file = file;
     database->m_identity = defaultsfile::identity(file);
     // Without SQLITE_OPEN_CREATE: SQLite would make the file readable for everybody.
-    const int result = sqlite3_open_v2(file.c_str(), &database->m_connection,
-                                       SQLITE_OPEN_READWRITE | SQLITE_OPEN_NOMUTEX | SQLITE_OPEN_EXRESCODE, nullptr);
+    const int result =
+        sqlite3_open_v2(file.c_str(), &database->m_connection,
+                        SQLITE_OPEN_READWRITE | SQLITE_OPEN_NOMUTEX | SQLITE_OPEN_EXRESCODE, boundedwait::fileSystem());
     outcome = database->outcome(result);
     if (outcome != Outcome::Done)
         return nullptr;
@@ -77,6 +80,12 @@ DefaultsDatabase::~DefaultsDatabase()
 void DefaultsDatabase::keepFilesOnClose()
 {
     sqlite3_db_config(m_connection, SQLITE_DBCONFIG_NO_CKPT_ON_CLOSE, 1, nullptr);
+}
+
+void DefaultsDatabase::setDeadline(Clock::time_point deadline)
+{
+    m_deadline = deadline;
+    boundedwait::setDeadline(deadline);
 }
 
 int DefaultsDatabase::waitForOthers(void *self, int attempt)

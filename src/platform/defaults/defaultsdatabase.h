@@ -42,7 +42,7 @@ public:
 
     /** Until when the following steps may wait for other processes. */
     using Clock = std::chrono::steady_clock;
-    void setDeadline(Clock::time_point deadline) { m_deadline = deadline; }
+    void setDeadline(Clock::time_point deadline);
 
     Outcome read(std::string_view key, std::optional<EncodedValue> &value);
     /** Runs @p steps while no other process can write, and makes what they wrote durable when they end as Done. */

@@ -4,6 +4,7 @@
 #include <QTemporaryDir>
 #include <QtTest>
 
+#include <fcntl.h>
 #include <sys/mman.h>
 #include <sys/wait.h>
 #include <unistd.h>
@@ -185,6 +186,34 @@ private Q_SLOTS:
         ::waitpid(holder, nullptr, 0);
         QVERIFY(UserDefaults(m_file).string("key") == "before");
         QVERIFY(defaults.set("key", std::string("after")));
+        QVERIFY(UserDefaults(m_file).string("key") == "after");
+    }
+
+    void aProcessThatStopsWhileItMakesTheIndexDoesNotBlock()
+    {
+        const pid_t first = startChild([&] { UserDefaults(m_file).set("key", std::string("before")); });
+        QVERIFY(endedWell(first));
+        SharedNumber inside;
+        const pid_t holder = startChild([&] {
+            constexpr off_t lockOfTheMaker = 128;
+            const auto index = m_file.string() + "-shm";
+            const int file = ::open(index.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0600);
+            flock lock = {};
+            lock.l_type = F_WRLCK;
+            lock.l_start = lockOfTheMaker;
+            lock.l_len = 1;
+            inside->store(::fcntl(file, F_SETLK, &lock) == 0 ? 1 : -1);
+            // Far longer than anybody should wait for it.
+            ::sleep(4);
+        });
+        QVERIFY(QTest::qWaitFor([&] { return inside->load() != 0; }));
+        QCOMPARE(inside->load(), 1);
+        UserDefaults defaults(m_file);
+        QVERIFY(!defaults.set("key", std::string("after")));
+        QVERIFY(defaults.string("key") == "after");
+        ::kill(holder, SIGKILL);
+        ::waitpid(holder, nullptr, 0);
+        QVERIFY(defaults.set("other", std::string("x")));
         QVERIFY(UserDefaults(m_file).string("key") == "after");
     }
 
