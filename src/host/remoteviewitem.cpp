@@ -86,6 +86,9 @@ void RemoteViewItem::configureSurface()
 void RemoteViewItem::surfaceDidChange(const QRegion &damage)
 {
     m_damage += damage;
+    // The picker goes on drawing when its frame was shown; what the app hides is not to be drawn by either.
+    if (!isVisible())
+        return;
     update();
     hastenFrame();
 }
@@ -151,6 +154,8 @@ void RemoteViewItem::itemChange(ItemChange change, const ItemChangeData &value)
     QQuickItem::itemChange(change, value);
     if (change == ItemSceneChange)
         followWindow(value.window);
+    if (change == ItemVisibleHasChanged && value.boolValue)
+        update();
     if (change == ItemSceneChange || change == ItemDevicePixelRatioHasChanged)
         configureSurface();
 }

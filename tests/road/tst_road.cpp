@@ -27,6 +27,7 @@ private Q_SLOTS:
     void theAppEndsThePresentation();
     void aGestureThatTheEndCutsOffIsMadeFinal();
     void anEmbeddedPickerFillsItsContainer();
+    void nothingIsDrawnWhileTheAppHidesThePicker();
     void aKilledServiceIsReportedAndPresentingAgainWorks();
     void aServiceThatCannotRunIsReported_data();
     void aServiceThatCannotRunIsReported();
@@ -249,6 +250,35 @@ void RoadTest::aKilledServiceIsReportedAndPresentingAgainWorks()
         QTest::mouseRelease(&host.window, Qt::LeftButton, {}, QPoint(5, 5));
     }
     QVERIFY(finished.isEmpty());
+}
+
+void RoadTest::nothingIsDrawnWhileTheAppHidesThePicker()
+{
+    RoadHost host;
+    QQuickItem container(host.window.contentItem());
+    container.setSize(QSizeF(360, 560));
+    host.picker.embed(&container);
+    QTRY_VERIFY(host.isReady());
+    // The well fills a place with the color.
+    const auto shows = [&host](QRgb color) {
+        const QImage picture = host.window.grabWindow().convertToFormat(QImage::Format_RGB32);
+        const auto *pixels = reinterpret_cast<const QRgb *>(picture.constBits());
+        return std::count(pixels, pixels + picture.sizeInBytes() / 4, color) > 1000;
+    };
+    host.picker.setSelectedColor(FVColor(0, 0, 1));
+    QTRY_VERIFY(shows(qRgb(0, 0, 255)));
+
+    container.setVisible(false);
+    QSignalSpy frames(&host.window, &QQuickWindow::frameSwapped);
+    constexpr int changes = 12;
+    for (int i = 1; i <= changes; ++i) {
+        host.picker.setSelectedColor(FVColor(1, 1 - double(i) / changes, 0));
+        frames.wait(40);
+    }
+    // The window's without it, and one that was on its way.
+    QVERIFY2(frames.count() <= 3, qPrintable(QString::number(frames.count())));
+    container.setVisible(true);
+    QTRY_VERIFY(shows(qRgb(255, 0, 0)));
 }
 
 void RoadTest::aServiceThatCannotRunIsReported_data()
