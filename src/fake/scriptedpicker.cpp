@@ -2,17 +2,8 @@
 
 #include "host/colorbridge.h"
 
-#include <QQuickItem>
-#include <QQuickWindow>
-
-std::unique_ptr<favrin::host::Picker> favrin::host::Picker::create()
-{
-    return std::make_unique<fake::ScriptedPicker>();
-}
-
 namespace favrin::fake {
 
-using host::PresentationStyle;
 using Kind = ScriptStep::Kind;
 
 namespace {
@@ -22,42 +13,30 @@ constexpr QSizeF usualSize(360, 560);
 
 } // namespace
 
-ScriptedPicker::~ScriptedPicker()
-{
-    delete m_view;
-}
+ScriptedPicker::~ScriptedPicker() = default;
 
 QSizeF ScriptedPicker::hostWindowSize() const
 {
     if (wishes().hostWindowSize)
         return *wishes().hostWindowSize;
-    return m_view && m_view->window() ? QSizeF(m_view->window()->size()) : QSizeF(0, 0);
+    return m_place ? m_place->surroundingSize() : QSizeF(0, 0);
 }
 
-void ScriptedPicker::present(PresentationStyle style, QQuickItem &place)
+void ScriptedPicker::present(const MakePlace &makePlace)
 {
     if (isPresented())
         return;
     ++m_presentation;
-    setEmbedded(style == PresentationStyle::Embedded);
-    placeView(style, place);
+    m_place.reset();
+    m_place = makePlace();
+    setEmbedded(m_place->style() == host::PresentationStyle::Embedded);
+    m_place->setPreferredContentSize(usualSize);
+    // Like a real picker, it ends when the app takes its place away.
+    connect(m_place.get(), &host::PickerPlace::wasLost, this, [this] { later(&ScriptedPicker::finish); });
     m_steps = takeWaitingScript().value_or(ScriptSteps());
     setState(State::Starting);
     Q_EMIT surroundingsChanged();
     later(&ScriptedPicker::open);
-}
-
-void ScriptedPicker::placeView(PresentationStyle style, QQuickItem &place)
-{
-    delete m_view;
-    QQuickItem *parent = style == PresentationStyle::Embedded ? &place : place.window()->contentItem();
-    m_view = new QQuickItem(parent);
-    const QRectF anchor = place.mapRectToItem(parent, place.boundingRect());
-    const auto layout = host::layoutPresentation(style, parent->size(), usualSize, anchor);
-    m_view->setPosition(layout.panel.topLeft());
-    m_view->setSize(layout.panel.size());
-    // Like a real picker, it ends when the app takes its place away.
-    connect(&place, &QObject::destroyed, this, [this] { later(&ScriptedPicker::finish); });
 }
 
 void ScriptedPicker::later(void (ScriptedPicker::*action)())
@@ -138,7 +117,7 @@ void ScriptedPicker::dismiss()
 
 void ScriptedPicker::end(State state)
 {
-    delete m_view;
+    m_place.reset();
     setState(state);
 }
 

@@ -1,15 +1,13 @@
 #pragma once
 
 #include "fake/scriptstep.h"
-#include "host/picker.h"
-
-#include <QPointer>
+#include "host/session/picker.h"
 
 namespace favrin::fake {
 
 /**
  * A picker without a process: goes through the states of a real one and plays a script, one step in each turn of the
- * event loop. Its view is an item without a picture, placed and sized as a real one.
+ * event loop. Its place stays without a picture.
  */
 class ScriptedPicker : public host::Picker
 {
@@ -23,15 +21,14 @@ public:
     QSizeF hostWindowSize() const override;
     double keyboardSpace() const override { return wishes().keyboardSpace.value_or(0.0); }
 
-    void present(host::PresentationStyle style, QQuickItem &place) override;
+    void present(const MakePlace &makePlace) override;
     void dismiss() override;
-    QQuickItem *view() const override { return m_view; }
+    host::PickerPlace *place() const override { return m_place.get(); }
     /** Scripts play one. */
     bool isEyedropperAvailable() override { return true; }
 
 private:
     void wishesDidChange() override {}
-    void placeView(host::PresentationStyle style, QQuickItem &place);
     /** In the next turn of the event loop, unless the presentation has ended by then. */
     void later(void (ScriptedPicker::*action)());
     void open();
@@ -41,7 +38,7 @@ private:
     void end(State state);
     void finish();
 
-    QPointer<QQuickItem> m_view;
+    std::unique_ptr<host::PickerPlace> m_place;
     ScriptSteps m_steps;
     /** Counts presentations, so that what one has queued does not reach the next. */
     int m_presentation = 0;

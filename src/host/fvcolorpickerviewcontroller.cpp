@@ -2,11 +2,13 @@
 
 #include "host/colorbridge.h"
 #include "host/fvcolorpickerviewcontroller_p.h"
+#include "host/itemplace.h"
 
 #include <QQuickWindow>
 
 #include <utility>
 
+using favrin::host::ItemPlace;
 using favrin::host::Picker;
 using favrin::host::PresentationStyle;
 
@@ -51,6 +53,11 @@ FVColorPickerViewController::Private::Private(FVColorPickerViewController &contr
         Q_EMIT self->hostWindowSizeChanged();
         Q_EMIT self->keyboardSpaceChanged();
     });
+}
+
+void FVColorPickerViewController::Private::present(PresentationStyle style, QQuickItem &place)
+{
+    picker->present([style, &place] { return ItemPlace::create(style, place); });
 }
 
 FVColorPickerViewController::FVColorPickerViewController(QObject *parent)
@@ -103,19 +110,19 @@ FVColorPickerViewController::State FVColorPickerViewController::state() const
 void FVColorPickerViewController::present(QQuickWindow *window)
 {
     if (window)
-        d->picker->present(PresentationStyle::Presented, *window->contentItem());
+        d->present(PresentationStyle::Presented, *window->contentItem());
 }
 
 void FVColorPickerViewController::presentPopover(QQuickItem *anchor)
 {
     if (anchor && anchor->window())
-        d->picker->present(PresentationStyle::Popover, *anchor);
+        d->present(PresentationStyle::Popover, *anchor);
 }
 
 void FVColorPickerViewController::embed(QQuickItem *container)
 {
     if (container && container->window())
-        d->picker->present(PresentationStyle::Embedded, *container);
+        d->present(PresentationStyle::Embedded, *container);
 }
 
 void FVColorPickerViewController::dismiss()
@@ -125,5 +132,6 @@ void FVColorPickerViewController::dismiss()
 
 QQuickItem *FVColorPickerViewController::view() const
 {
-    return d->picker->view();
+    const auto *place = qobject_cast<ItemPlace *>(d->picker->place());
+    return place ? place->view() : nullptr;
 }

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "host/fvcolorpickerviewcontroller.h"
-#include "host/picker.h"
+#include "host/session/picker.h"
 
 class FVColorPickerViewController::Private
 {
@@ -14,6 +14,8 @@ public:
     QSizeF preferredContentSize = QSizeF(0, 0);
     bool wantsMaterial = false;
     bool responding = true;
+
+    void present(favrin::host::PresentationStyle style, QQuickItem &place);
 
     /** Stores @p value through @p field of the wishes; false when it is there already. */
     template<class Field, class Value>

@@ -1,8 +1,8 @@
 #include "host/fvcolorpickerviewcontroller.h"
 
-#include "host/remotepicker.h"
-#include "host/serviceahead.h"
-#include "host/serviceprocess.h"
+#include "host/session/launchedservice.h"
+#include "host/session/remotepicker.h"
+#include "host/session/serviceahead.h"
 
 #include <QCoreApplication>
 
@@ -19,5 +19,5 @@ void FVColorPickerViewController::startServiceAhead()
 
 QString FVColorPickerViewController::servicePath()
 {
-    return favrin::host::ServiceProcess::program();
+    return QString::fromLocal8Bit(favrin::host::servicePath().c_str());
 }

@@ -1,5 +1,6 @@
 #include "host/presentation.h"
 
+#include "host/presentationlayout.h"
 #include "host/presentationpanel.h"
 #include "host/presentationscrim.h"
 #include "host/remoteviewitem.h"
@@ -17,19 +18,20 @@ constexpr int revealMilliseconds = 160;
 
 } // namespace
 
-Presentation::Presentation(PresentationStyle style, QQuickItem &place, QObject *parent)
-    : QObject(parent)
-    , m_style(style)
+std::unique_ptr<ItemPlace> ItemPlace::create(PresentationStyle style, QQuickItem &place)
+{
+    return std::make_unique<Presentation>(style, place);
+}
+
+Presentation::Presentation(PresentationStyle style, QQuickItem &place)
+    : m_style(style)
     , m_place(&place)
     , m_parentItem(style == PresentationStyle::Embedded ? &place : place.window()->contentItem())
     , m_focusBefore(place.window() ? place.window()->activeFocusItem() : nullptr)
 {
     build();
-    connect(m_parentItem, &QQuickItem::widthChanged, this, &Presentation::layOut);
-    connect(m_parentItem, &QQuickItem::heightChanged, this, &Presentation::layOut);
-    connect(m_place, &QObject::destroyed, this, &Presentation::placeWasLost);
-    connect(m_place, &QQuickItem::windowChanged, this, &Presentation::placeWasLost);
     layOut();
+    follow();
 }
 
 Presentation::~Presentation()
@@ -43,17 +45,54 @@ Presentation::~Presentation()
         m_focusBefore->forceActiveFocus(Qt::PopupFocusReason);
 }
 
+void Presentation::follow()
+{
+    connect(m_parentItem, &QQuickItem::widthChanged, this, &Presentation::layOut);
+    connect(m_parentItem, &QQuickItem::heightChanged, this, &Presentation::layOut);
+    connect(m_place, &QObject::destroyed, this, &Presentation::wasLost);
+    connect(m_place, &QQuickItem::windowChanged, this, &Presentation::wasLost);
+    connect(m_view, &QQuickItem::widthChanged, this, &Presentation::changed);
+    connect(m_view, &QQuickItem::heightChanged, this, &Presentation::changed);
+    if (const QWindow *shownIn = window()) {
+        connect(shownIn, &QWindow::widthChanged, this, &Presentation::changed);
+        connect(shownIn, &QWindow::heightChanged, this, &Presentation::changed);
+        connect(shownIn, &QWindow::screenChanged, this, &Presentation::changed);
+    }
+}
+
+QWindow *Presentation::window() const
+{
+    return m_parentItem ? m_parentItem->window() : nullptr;
+}
+
 QSizeF Presentation::surroundingSize() const
 {
     if (m_style == PresentationStyle::Embedded)
         return m_place ? m_place->size() : QSizeF(0, 0);
-    const QQuickWindow *shownIn = window();
+    const QWindow *shownIn = window();
     return shownIn ? QSizeF(shownIn->size()) : QSizeF(0, 0);
 }
 
-QQuickWindow *Presentation::window() const
+QRectF Presentation::rectangle() const
 {
-    return m_parentItem ? m_parentItem->window() : nullptr;
+    return m_view ? m_view->mapRectToScene(m_view->boundingRect()) : QRectF();
+}
+
+QQuickItem *Presentation::view() const
+{
+    return m_view;
+}
+
+void Presentation::setSession(RemoteViewSession *session)
+{
+    if (m_view)
+        m_view->setSession(session);
+}
+
+void Presentation::takeFocus()
+{
+    if (m_view)
+        m_view->forceActiveFocus(Qt::PopupFocusReason);
 }
 
 void Presentation::build()

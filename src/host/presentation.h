@@ -1,15 +1,9 @@
 #pragma once
 
-#include "host/presentationlayout.h"
+#include "host/itemplace.h"
 
-#include <QObject>
 #include <QPointer>
-#include <QSizeF>
-
-#include <memory>
-
-class QQuickItem;
-class QQuickWindow;
+#include <QQuickItem>
 
 namespace favrin::host {
 
@@ -21,34 +15,29 @@ class RemoteViewItem;
  * The place of one picker in a window of the app: over its content, in a popover or inside an item. Owns the items it
  * puts there, follows the window's size, and gives the focus back when it goes.
  */
-class Presentation : public QObject
+class Presentation : public ItemPlace
 {
     Q_OBJECT
 
 public:
-    /** @p place is the anchor of a popover or the container of an embedded picker, else the window's content. */
-    Presentation(PresentationStyle style, QQuickItem &place, QObject *parent = nullptr);
+    Presentation(PresentationStyle style, QQuickItem &place);
     ~Presentation() override;
 
-    PresentationStyle style() const { return m_style; }
-    QQuickWindow *window() const;
-    RemoteViewItem *view() const { return m_view.data(); }
-    /** What the picker adapts its layout to: the container that it is embedded in, otherwise the window. */
-    QSizeF surroundingSize() const;
+    PresentationStyle style() const override { return m_style; }
+    QWindow *window() const override;
+    QSizeF surroundingSize() const override;
+    QRectF rectangle() const override;
+    QQuickItem *view() const override;
 
-    void setPreferredContentSize(QSizeF size);
-    void setAppearance(bool dark);
-    /** Shows what was hidden so far; the picker has drawn. */
-    void reveal(bool animated);
-
-Q_SIGNALS:
-    /** The user touched or clicked outside of a popover. */
-    void dismissRequested();
-    /** The app took away the place where the picker stands. */
-    void placeWasLost();
+    void setSession(RemoteViewSession *session) override;
+    void takeFocus() override;
+    void setPreferredContentSize(QSizeF size) override;
+    void setAppearance(bool dark) override;
+    void reveal(bool animated) override;
 
 private:
     void build();
+    void follow();
     void layOut();
 
     PresentationStyle m_style;

@@ -1,19 +1,11 @@
 #pragma once
 
+#include "host/session/pickerplace.h"
+
 #include <QRectF>
 #include <QSizeF>
 
 namespace favrin::host {
-
-/** Where a picker stands in its window. */
-enum class PresentationStyle {
-    /** Over the content: a sheet at the bottom of a narrow window, a card in the middle of a wide one. */
-    Presented,
-    /** In a popover that points at an item. */
-    Popover,
-    /** Inside an item of the app, which it fills. */
-    Embedded,
-};
 
 /** The side of the panel at which a popover's arrow sticks out. */
 enum class ArrowEdge { None, Top, Bottom };

@@ -1,5 +1,6 @@
 #include "host/presentationpanel.h"
 
+#include "host/session/panelcolor.h"
 #include "platform/shapes/dropshadow.h"
 
 #include <QMouseEvent>
@@ -20,15 +21,6 @@ constexpr double shadowRadius = 40;
 constexpr double shadowDrop = 6;
 constexpr QColor shadowColor(0, 0, 0, 64);
 constexpr double arrowHalfWidth = 13;
-
-/**
- * Opaque, with the material that a picker may want and without: nothing behind the panel is blurred, and what showed
- * through would only look like dirt. The picker's fields stand out from it.
- */
-QColor panelColor(bool dark)
-{
-    return dark ? QColor(0x26, 0x26, 0x29) : QColor(0xf2, 0xf2, 0xf6);
-}
 
 QColor edgeColor(bool dark)
 {

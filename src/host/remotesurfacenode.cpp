@@ -1,6 +1,6 @@
 #include "host/remotesurfacenode.h"
 
-#include "host/remotesurface.h"
+#include "host/session/remotesurface.h"
 
 #include <QQuickWindow>
 #include <QSGImageNode>

@@ -1,18 +1,12 @@
 #pragma once
 
-#include "host/remoteviewsession.h"
+#include "host/session/remoteviewinput.h"
 
 #include <QPointer>
 #include <QQuickItem>
 #include <QRegion>
 
-#include <memory>
-
 namespace favrin::host {
-
-class ClipboardBridge;
-class KeyboardForwarder;
-class PointerForwarder;
 
 /**
  * Shows the surface of a picker process and passes on what the user does with it: touch, pointer, wheel, keys, input
@@ -28,15 +22,9 @@ public:
 
     /** Shows another session, or nothing. */
     void setSession(RemoteViewSession *session);
-    RemoteViewSession *session() const { return m_session; }
-    /** Tells the session the size and scale there are now; afterwards it follows by itself. */
-    void configureSurface();
+    RemoteViewSession *session() const { return m_input.session(); }
 
     QVariant inputMethodQuery(Qt::InputMethodQuery query) const override;
-
-Q_SIGNALS:
-    /** The window has shown a frame that holds what the service drew last. */
-    void surfaceWasShown();
 
 protected:
     QSGNode *updatePaintNode(QSGNode *node, UpdatePaintNodeData *data) override;
@@ -61,25 +49,20 @@ protected:
     bool event(QEvent *event) override;
 
 private:
+    double pixelRatio() const;
     void followWindow(QQuickWindow *window);
-    void surfaceDidChange(const QRegion &damage);
+    void surfaceDidChange(const QRegion &damage, bool resized);
     void hastenFrame();
     void frameWasSwapped();
-    void textInputDidChange();
     void focusDidLeave(remote::FocusDirection direction);
 
-    QPointer<RemoteViewSession> m_session;
+    RemoteViewInput m_input;
     QPointer<QQuickWindow> m_window;
-    std::unique_ptr<PointerForwarder> m_pointer;
-    std::unique_ptr<KeyboardForwarder> m_keyboard;
-    std::unique_ptr<ClipboardBridge> m_clipboard;
     QRegion m_damage;
     bool m_imageIsNew = false;
     /** A frame of the service has been put into the scene and the window has not shown it yet. */
     bool m_waitingForSwap = false;
     bool m_frameIsHastened = false;
-    std::uint32_t m_inputMethodResets = 0;
-    bool m_inputPanelWanted = false;
 };
 
 } // namespace favrin::host

@@ -1,5 +1,6 @@
 #include "apps/tool/pickertool.h"
 #include "fake/fvcolorpickerscript.h"
+#include "fake/scriptedpicker.h"
 
 #include <QSignalSpy>
 #include <QTest>
@@ -24,12 +25,13 @@ public:
         if (!options.isEmpty())
             arguments += options.split(u' ');
         auto parsed = parseOptions(arguments);
-        tool = std::make_unique<PickerTool>(*parsed.options, [this](const std::string &line) {
-            lines.append(QString::fromStdString(line));
-            if (onLine)
-                onLine();
-            return isReadable;
-        });
+        tool = std::make_unique<PickerTool>(*parsed.options, std::make_unique<favrin::fake::ScriptedPicker>(),
+                                            [this](const std::string &line) {
+                                                lines.append(QString::fromStdString(line));
+                                                if (onLine)
+                                                    onLine();
+                                                return isReadable;
+                                            });
         QObject::connect(tool.get(), &PickerTool::ended, tool.get(), [this](ExitStatus value, const QString &) {
             status = value;
             ++ends;

@@ -1,121 +1,40 @@
-#include "apps/tool/pickertool.h"
-#include "apps/tool/windowparent.h"
+#include "apps/tool/exitstatus.h"
+#include "apps/tool/toolmain.h"
 
-#include <QGuiApplication>
-
-#include <csignal>
+#include <algorithm>
+#include <array>
 #include <cstdio>
-#include <cstdlib>
+#include <span>
+#include <string_view>
 
-using namespace favrin::tool;
+#include <dlfcn.h>
+
+// The picker's process needs longer than anything else here, so it is started before this one loads its own libraries:
+// the program links none of them, and the tool is a library that it opens.
 
 namespace {
 
-void say(const QString &text)
+/** These ask for a text only. What is wrong in other ways has a picker started in vain, which leaves by itself. */
+bool asksForText(std::span<char *const> arguments)
 {
-    std::fprintf(stderr, "favrin-color-picker: %s\n", qUtf8Printable(text));
-}
-
-bool printLine(const std::string &line)
-{
-    return std::fprintf(stdout, "%s\n", line.c_str()) >= 0 && std::fflush(stdout) == 0;
-}
-
-QtMessageHandler previousMessageHandler = nullptr;
-
-/** Qt leaves with status 1 when its display goes, which would say that the user cancelled. */
-void failWithTheDisplay(QtMsgType type, const QMessageLogContext &context, const QString &message)
-{
-    previousMessageHandler(type, context, message);
-    if (message.startsWith(u"The Wayland connection") || message.startsWith(u"The X11 connection broke"))
-        std::_Exit(static_cast<int>(ExitStatus::Failed));
-}
-
-QStringList texts(int count, char **arguments)
-{
-    QStringList list;
-    for (int i = 0; i < count; ++i)
-        list.append(QString::fromLocal8Bit(arguments[i]));
-    return list;
-}
-
-void setDefault(const char *variable, const QByteArray &value)
-{
-    if (qEnvironmentVariableIsEmpty(variable))
-        qputenv(variable, value);
-}
-
-/** The user wants no display: pictures only, as tests do. */
-bool isOffscreenWanted()
-{
-    return qgetenv("QT_QPA_PLATFORM").startsWith("offscreen");
-}
-
-/** The platforms to try, best first. The last one always starts, and tells that the others did not. */
-QByteArray platforms(const ParentHandle &parent)
-{
-    QByteArrayList list;
-    if (const QByteArray wanted = qgetenv("QT_QPA_PLATFORM"); !wanted.isEmpty()) {
-        list.append(wanted);
-    } else {
-        if (!qEnvironmentVariableIsEmpty("WAYLAND_DISPLAY"))
-            list.append("wayland");
-        if (!qEnvironmentVariableIsEmpty("DISPLAY"))
-            list.insert(std::holds_alternative<X11Window>(parent) ? 0 : list.size(), "xcb");
-    }
-    list.append("offscreen");
-    return list.join(';');
-}
-
-/** What Qt must know before it starts: nothing that the first frame does not need. */
-void prepareEnvironment(const ParentHandle &parent)
-{
-    qputenv("QT_QPA_PLATFORM", platforms(parent));
-    // Qt otherwise waits 5 ms before each frame, which a drag over the picker would show.
-    setDefault("QT_QPA_UPDATE_IDLE_TIME", "0");
-    setDefault("QSG_RENDER_LOOP", "basic");
-    QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
-    QGuiApplication::setApplicationName(QStringLiteral("favrin-color-picker"));
-    QGuiApplication::setApplicationDisplayName(QStringLiteral("Favrin Color Picker"));
-    QGuiApplication::setDesktopFileName(QStringLiteral("com.quenta.favrin.ColorPicker"));
+    constexpr std::array<std::string_view, 4> texts = {"-h", "--help", "-v", "--version"};
+    return std::ranges::any_of(
+        arguments, [&texts](std::string_view argument) { return std::ranges::find(texts, argument) != texts.end(); });
 }
 
 } // namespace
 
 int main(int argc, char *argv[])
 {
-    // A reader that has left is an error of writing, not the end of this process.
-    std::signal(SIGPIPE, SIG_IGN);
-    const ParsedOptions parsed = parseOptions(texts(argc, argv));
-    if (!parsed.options) {
-        if (parsed.status == ExitStatus::Chosen)
-            return static_cast<int>(printLine(parsed.text.toStdString()) ? ExitStatus::Chosen : ExitStatus::Failed);
-        say(parsed.text);
-        return static_cast<int>(parsed.status);
+    favrin::host::LaunchedService service;
+    if (!asksForText({argv, static_cast<std::size_t>(argc)}))
+        service = favrin::host::launchService(favrin::host::servicePath());
+    void *tool = dlopen(FAVRIN_TOOL_LIBRARY, RTLD_LAZY | RTLD_LOCAL);
+    auto *run =
+        tool ? reinterpret_cast<decltype(&favrinColorPickerMain)>(dlsym(tool, "favrinColorPickerMain")) : nullptr;
+    if (!run) {
+        std::fprintf(stderr, "favrin-color-picker: %s\n", dlerror());
+        return static_cast<int>(favrin::tool::ExitStatus::Failed);
     }
-    const bool isDisplayNeeded = !isOffscreenWanted();
-    previousMessageHandler = qInstallMessageHandler(failWithTheDisplay);
-    prepareEnvironment(parsed.options->parent);
-    // While Qt opens the display here, the picker is being loaded there.
-    FVColorPickerViewController::startServiceAhead();
-    int onlyTheName = 1;
-    QGuiApplication application(onlyTheName, argv);
-    if (isDisplayNeeded && QGuiApplication::platformName() == u"offscreen") {
-        say(QStringLiteral("there is no display to show the picker on"));
-        return static_cast<int>(ExitStatus::Failed);
-    }
-    FVColorPickerViewController::startServiceAhead();
-
-    PickerTool tool(*parsed.options, printLine, [&parsed](QWindow &window) {
-        const QString problem = attach(window, parsed.options->parent);
-        if (!problem.isEmpty())
-            say(problem);
-    });
-    QObject::connect(&tool, &PickerTool::ended, &application, [](ExitStatus status, const QString &reason) {
-        if (!reason.isEmpty())
-            say(reason);
-        QCoreApplication::exit(static_cast<int>(status));
-    });
-    tool.start();
-    return QGuiApplication::exec();
+    return run(argc, argv, &service);
 }

@@ -2,12 +2,13 @@
 
 #include "apps/tool/exitstatus.h"
 #include "apps/tool/tooloptions.h"
-#include "host/fvcolorpickerviewcontroller.h"
+#include "host/session/picker.h"
+#include "host/window/remoteviewwindow.h"
 
-#include <QQuickWindow>
 #include <QTimer>
 
 #include <functional>
+#include <memory>
 
 namespace favrin::tool {
 
@@ -25,11 +26,11 @@ public:
     /** Makes the window belong to another one, once it is shown. */
     using Attach = std::function<void(QWindow &window)>;
 
-    PickerTool(ToolOptions options, Print print, Attach attach = {});
+    PickerTool(ToolOptions options, std::unique_ptr<host::Picker> picker, Print print, Attach attach = {});
     ~PickerTool() override;
 
     void start();
-    QQuickWindow *window() { return m_window.get(); }
+    QWindow *window() { return m_window.get(); }
 
 Q_SIGNALS:
     /** Once. @p reason is for a person, and empty unless the tool failed. */
@@ -40,9 +41,8 @@ protected:
 
 private:
     void configurePicker();
-    void followPreferredSize();
     void show();
-    void takePick(const FVColor &color, bool isVolatile);
+    void takePick(const Choice &choice, bool isVolatile);
     void finish();
     void end(ExitStatus status, const QString &reason = {});
     std::string nameOf(const Choice &color) const;
@@ -50,8 +50,9 @@ private:
     const ToolOptions m_options;
     const Print m_print;
     const Attach m_attach;
-    FVColorPickerViewController m_picker;
-    std::unique_ptr<QQuickWindow> m_window;
+    std::unique_ptr<host::RemoteViewWindow> m_window;
+    /** Goes before the window that it is in. */
+    const std::unique_ptr<host::Picker> m_picker;
     QTimer m_timeout;
     /** The last final pick; unset while there is none. */
     std::optional<Choice> m_chosen;

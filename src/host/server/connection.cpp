@@ -54,28 +54,38 @@ Connection::~Connection()
 
 int Connection::open()
 {
-    if (m_client) {
-        errno = EALREADY;
-        return -1;
-    }
     std::array<int, 2> ends = {-1, -1};
     if (::socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, ends.data()) != 0)
         return -1;
     const auto [ours, theirs] = ends;
-    ::setsockopt(ours, SOL_SOCKET, SO_SNDBUF, &wantedSendBuffer, sizeof wantedSendBuffer);
-    m_client = wl_client_create(m_display, ours);
+    if (adopt(ours))
+        return theirs;
+    const int error = errno;
+    ::close(theirs);
+    errno = error;
+    return -1;
+}
+
+bool Connection::adopt(int socket)
+{
+    if (m_client) {
+        ::close(socket);
+        errno = EALREADY;
+        return false;
+    }
+    ::setsockopt(socket, SOL_SOCKET, SO_SNDBUF, &wantedSendBuffer, sizeof wantedSendBuffer);
+    m_client = wl_client_create(m_display, socket);
     if (!m_client) {
         const int error = errno;
-        ::close(ours);
-        ::close(theirs);
+        ::close(socket);
         errno = error;
-        return -1;
+        return false;
     }
-    m_sendBuffer = sendBufferOf(ours);
+    m_sendBuffer = sendBufferOf(socket);
     wl_client_add_destroy_listener(m_client, &m_clientListener);
     m_objects.watch(m_client);
     m_sharedMemory.watch(m_client);
-    return theirs;
+    return true;
 }
 
 int Connection::fileDescriptor() const

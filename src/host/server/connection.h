@@ -15,7 +15,7 @@
 namespace favrin::host::server {
 
 /**
- * The display, the one client and the socket between them: opening, reading, sending with care, and the end.
+ * The display, the one client and the socket between them: taking over, reading, sending with care, and the end.
  *
  * The end is noticed anywhere but told only by takeEnd(), so that nobody is called in the middle of libwayland's work.
  */
@@ -34,6 +34,7 @@ public:
     Connection &operator=(const Connection &) = delete;
 
     int open();
+    bool adopt(int socket);
     int fileDescriptor() const;
     wl_display *display() const { return m_display; }
     /** Null before the opening and after the end. */

@@ -89,6 +89,11 @@ int RemoteViewServer::openConnection()
     return d->connection.open();
 }
 
+bool RemoteViewServer::adoptConnection(int socket)
+{
+    return d->connection.adopt(socket);
+}
+
 int RemoteViewServer::fileDescriptor() const
 {
     return d->connection.fileDescriptor();

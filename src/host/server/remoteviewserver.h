@@ -148,6 +148,11 @@ public:
      * clears it in the child), or -1 with errno.
      */
     int openConnection();
+    /**
+     * Serves the client at the other end of @p socket, which belongs to the server from now on, instead of
+     * openConnection(). False with errno when that cannot be; the socket is closed then.
+     */
+    bool adoptConnection(int socket);
 
     int fileDescriptor() const;
     /**

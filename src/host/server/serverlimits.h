@@ -34,6 +34,9 @@ inline constexpr std::size_t objectsOfOtherKinds = 64;
 /** Shared memory mapped into the host: two 4K screens, five times buffered. */
 inline constexpr std::size_t sharedMemoryBytes = 384u * 1024u * 1024u;
 
+/** Open files that came with the service's messages and that no request of it has taken. */
+inline constexpr std::size_t strayFiles = 64;
+
 /** Damage rectangles of one frame; more of them become their bounding box. */
 inline constexpr std::size_t damageRectangles = 16;
 

@@ -1,4 +1,4 @@
-#include "host/compositorkeymap.h"
+#include "host/session/compositorkeymap.h"
 
 #include <cstdint>
 #include <memory>

@@ -1,6 +1,6 @@
-#include "host/keyboardforwarder.h"
+#include "host/session/keyboardforwarder.h"
 
-#include "host/remoteviewsession.h"
+#include "host/session/remoteviewsession.h"
 
 #include <QInputMethodEvent>
 #include <QKeyEvent>

@@ -1,4 +1,4 @@
-#include "host/hostlog.h"
+#include "host/session/hostlog.h"
 
 namespace favrin::host {
 

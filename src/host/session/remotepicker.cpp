@@ -1,20 +1,18 @@
-#include "host/remotepicker.h"
+#include "host/session/remotepicker.h"
 
 #include "eyedropper/displayidentifier.h"
 #include "eyedropper/eyedropperavailability.h"
-#include "host/presentation.h"
-#include "host/remoteviewitem.h"
-#include "host/remoteviewsession.h"
-#include "host/serviceahead.h"
-#include "host/servicewatch.h"
+#include "host/session/remoteviewsession.h"
+#include "host/session/serviceahead.h"
+#include "host/session/servicewatch.h"
 
 #include <QEvent>
 #include <QGuiApplication>
 #include <QInputMethod>
 #include <QPalette>
 #include <QPointer>
-#include <QQuickWindow>
 #include <QScreen>
+#include <QWindow>
 
 #include <utility>
 
@@ -40,7 +38,7 @@ remote::PresentationContext contextOf(PresentationStyle style)
     return remote::PresentationContext::Unspecified;
 }
 
-std::string displayIdentifier(const QQuickWindow *window)
+std::string displayIdentifier(const QWindow *window)
 {
     const QScreen *screen = window ? window->screen() : QGuiApplication::primaryScreen();
     return eyedropper::displayIdentifier(screen).toStdString();
@@ -93,10 +91,9 @@ bool RemotePicker::isDark() const
 
 remote::Traits RemotePicker::traits() const
 {
-    const QQuickWindow *window = m_presentation ? m_presentation->window() : nullptr;
+    const QWindow *window = m_place ? m_place->window() : nullptr;
     remote::Traits traits;
-    traits.presentationContext =
-        m_presentation ? contextOf(m_presentation->style()) : remote::PresentationContext::Unspecified;
+    traits.presentationContext = m_place ? contextOf(m_place->style()) : remote::PresentationContext::Unspecified;
     traits.appearance = wishes().appearance;
     if (traits.appearance == remote::Appearance::Unspecified) {
         const bool dark = QGuiApplication::palette().color(QPalette::Window).lightnessF() < 0.5f;
@@ -118,27 +115,20 @@ QSizeF RemotePicker::hostWindowSize() const
 {
     if (wishes().hostWindowSize)
         return *wishes().hostWindowSize;
-    return m_presentation ? m_presentation->surroundingSize() : QSizeF(0, 0);
+    return m_place ? m_place->surroundingSize() : QSizeF(0, 0);
 }
 
 double RemotePicker::keyboardSpace() const
 {
     if (wishes().keyboardSpace)
         return *wishes().keyboardSpace;
-    const auto *item = view();
     const auto *inputMethod = QGuiApplication::inputMethod();
-    if (!item || !inputMethod->isVisible())
+    if (!m_place || !inputMethod->isVisible())
         return 0;
     const QRectF keyboard = inputMethod->keyboardRectangle();
     if (keyboard.isEmpty())
         return 0;
-    const QRectF place = item->mapRectToScene(item->boundingRect());
-    return std::max(0.0, place.bottom() - keyboard.top());
-}
-
-QQuickItem *RemotePicker::view() const
-{
-    return m_presentation ? m_presentation->view() : nullptr;
+    return std::max(0.0, m_place->rectangle().bottom() - keyboard.top());
 }
 
 bool RemotePicker::isEyedropperAvailable()
@@ -155,13 +145,13 @@ qint64 RemotePicker::serviceProcessIdentifier() const
     return m_session ? m_session->processIdentifier() : 0;
 }
 
-void RemotePicker::present(PresentationStyle style, QQuickItem &place)
+void RemotePicker::present(const MakePlace &makePlace)
 {
     if (isPresented())
         return;
     tearDown();
-    m_presentation = std::make_unique<Presentation>(style, place);
-    setEmbedded(style == PresentationStyle::Embedded);
+    m_place = makePlace();
+    setEmbedded(m_place->style() == PresentationStyle::Embedded);
     QString error;
     m_session = ServiceAhead::instance().take(traits(), &error);
     setState(State::Starting);
@@ -173,7 +163,7 @@ void RemotePicker::present(PresentationStyle style, QQuickItem &place)
     }
     connectSession();
     connectSurroundings();
-    m_presentation->setAppearance(isDark());
+    m_place->setAppearance(isDark());
     sendUpdate();
     if (m_selectedColorIsSet)
         setSelectedColor(m_selectedColor);
@@ -221,32 +211,23 @@ void RemotePicker::connectSession()
 void RemotePicker::followService()
 {
     const bool material = m_session->backgroundEffect() == remote::BackgroundEffect::ThickMaterial;
-    m_presentation->setPreferredContentSize(m_session->preferredContentSize());
+    m_place->setPreferredContentSize(m_session->preferredContentSize());
     Q_EMIT preferredContentSizeChanged(m_session->preferredContentSize());
     Q_EMIT materialChanged(material);
 }
 
 void RemotePicker::connectSurroundings()
 {
-    connect(m_presentation.get(), &Presentation::dismissRequested, this, &RemotePicker::dismiss);
-    connect(m_presentation.get(), &Presentation::placeWasLost, this, &RemotePicker::serviceFinished,
-            Qt::QueuedConnection);
+    connect(m_place.get(), &PickerPlace::dismissRequested, this, &RemotePicker::dismiss);
+    connect(m_place.get(), &PickerPlace::wasLost, this, &RemotePicker::serviceFinished, Qt::QueuedConnection);
     const auto update = [this] {
         scheduleUpdate();
         Q_EMIT surroundingsChanged();
     };
-    if (const auto *view = m_presentation->view()) {
-        connect(view, &QQuickItem::widthChanged, m_presentation.get(), update);
-        connect(view, &QQuickItem::heightChanged, m_presentation.get(), update);
-    }
-    if (const auto *window = m_presentation->window()) {
-        connect(window, &QQuickWindow::widthChanged, m_presentation.get(), update);
-        connect(window, &QQuickWindow::heightChanged, m_presentation.get(), update);
-        connect(window, &QQuickWindow::screenChanged, m_presentation.get(), update);
-    }
+    connect(m_place.get(), &PickerPlace::changed, this, update);
     const auto *inputMethod = QGuiApplication::inputMethod();
-    connect(inputMethod, &QInputMethod::keyboardRectangleChanged, m_presentation.get(), update);
-    connect(inputMethod, &QInputMethod::visibleChanged, m_presentation.get(), update);
+    connect(inputMethod, &QInputMethod::keyboardRectangleChanged, m_place.get(), update);
+    connect(inputMethod, &QInputMethod::visibleChanged, m_place.get(), update);
 }
 
 void RemotePicker::scheduleUpdate()
@@ -265,7 +246,7 @@ void RemotePicker::sendUpdate()
     if (now != m_sentTraits) {
         m_session->server().sendTraits(now);
         m_sentTraits = std::move(now);
-        m_presentation->setAppearance(isDark());
+        m_place->setAppearance(isDark());
     }
     auto configuration = wishes().configuration;
     configuration.hostWindowWidth = hostWindowSize().width();
@@ -296,8 +277,8 @@ void RemotePicker::servicePrepared(quint32 serial)
     if (serial != m_serial || state() != State::Starting)
         return;
     // The preferred size came before the answer, so the first frame has the right size already.
-    m_presentation->view()->setSession(m_session.get());
-    m_presentation->view()->forceActiveFocus(Qt::PopupFocusReason);
+    m_place->setSession(m_session.get());
+    m_place->takeFocus();
     m_session->server().sendPresent();
     m_session->flush();
 }
@@ -306,7 +287,7 @@ void RemotePicker::serviceDrew()
 {
     if (state() != State::Starting)
         return;
-    m_presentation->reveal(!wishes().reduceMotion);
+    m_place->reveal(!wishes().reduceMotion);
     setState(State::Ready);
 }
 
@@ -352,9 +333,9 @@ void RemotePicker::tearDown()
     m_watch.reset();
     m_sentTraits.reset();
     m_sentConfiguration.reset();
-    if (m_presentation && m_presentation->view())
-        m_presentation->view()->setSession(nullptr);
-    m_presentation.reset();
+    if (m_place)
+        m_place->setSession(nullptr);
+    m_place.reset();
     if (m_session) {
         m_session->disconnect(this);
         m_session.release()->abandon();

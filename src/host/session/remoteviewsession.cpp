@@ -1,8 +1,8 @@
-#include "host/remoteviewsession.h"
+#include "host/session/remoteviewsession.h"
 
-#include "host/hostkeymap.h"
-#include "host/hostlog.h"
-#include "host/serviceprocess.h"
+#include "host/session/hostkeymap.h"
+#include "host/session/hostlog.h"
+#include "host/session/serviceprocess.h"
 
 #include <QGuiApplication>
 #include <QSocketNotifier>
@@ -126,17 +126,19 @@ void RemoteViewSession::flush()
     Q_EMIT told();
 }
 
-QString RemoteViewSession::launch()
+QString RemoteViewSession::adopt(LaunchedService service)
 {
-    const int socket = m_server->openConnection();
-    if (socket < 0)
-        return QStringLiteral("No connection could be made: %1").arg(QString::fromLocal8Bit(std::strerror(errno)));
+    if (service.process == 0)
+        return QString::fromLocal8Bit(service.error.c_str());
+    m_process->adopt(service.process);
     connect(m_process.get(), &ServiceProcess::ended, this, [this](const QString &description) {
         // What the service still said before it ended is on the socket; the end of the connection comes behind it.
         dispatch();
         finish(QStringLiteral("The color picker's process ended: %1.").arg(description));
     });
-    return m_process->start(socket);
+    if (m_server->adoptConnection(service.socket))
+        return {};
+    return QStringLiteral("No connection could be made: %1").arg(QString::fromLocal8Bit(std::strerror(errno)));
 }
 
 void RemoteViewSession::attend()
@@ -152,7 +154,7 @@ void RemoteViewSession::attend()
 
 QString RemoteViewSession::start()
 {
-    const QString error = launch();
+    const QString error = adopt(launchService(servicePath()));
     if (error.isEmpty())
         attend();
     return error;

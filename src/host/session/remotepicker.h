@@ -1,12 +1,11 @@
 #pragma once
 
-#include "host/picker.h"
+#include "host/session/picker.h"
 
 #include <QTimer>
 
 namespace favrin::host {
 
-class Presentation;
 class RemoteViewSession;
 class ServiceWatch;
 
@@ -28,9 +27,9 @@ public:
     QSizeF hostWindowSize() const override;
     double keyboardSpace() const override;
 
-    void present(PresentationStyle style, QQuickItem &place) override;
+    void present(const MakePlace &makePlace) override;
     void dismiss() override;
-    QQuickItem *view() const override;
+    PickerPlace *place() const override { return m_place.get(); }
     bool isEyedropperAvailable() override;
     /** For tests and for those who watch the process; 0 while none runs. */
     qint64 serviceProcessIdentifier() const;
@@ -56,7 +55,7 @@ private:
     bool m_selectedColorIsSet = false;
     std::unique_ptr<RemoteViewSession> m_session;
     std::unique_ptr<ServiceWatch> m_watch;
-    std::unique_ptr<Presentation> m_presentation;
+    std::unique_ptr<PickerPlace> m_place;
     QTimer m_farewell;
     quint32 m_serial = 0;
     bool m_updateScheduled = false;

@@ -1,4 +1,4 @@
-#include "host/remotesurface.h"
+#include "host/session/remotesurface.h"
 
 #include "host/server/remoteviewserver.h"
 

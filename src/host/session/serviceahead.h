@@ -1,5 +1,6 @@
 #pragma once
 
+#include "host/session/launchedservice.h"
 #include "remote/records.h"
 
 #include <QObject>
@@ -20,6 +21,8 @@ public:
 
     /** Starts the process alone, unless one waits already: all that can be done before there is an application. */
     void launch();
+    /** Keeps one that was started even before. */
+    void adopt(LaunchedService service);
     /** Starts one with these traits, or goes on with the one that was launched, unless one waits already. */
     void start(const remote::Traits &traits);
     bool isReady() const;

@@ -1,17 +1,16 @@
 #pragma once
 
-#include "host/presentationlayout.h"
+#include "host/session/pickerplace.h"
 #include "remote/records.h"
 
 #include <QLocale>
 #include <QObject>
 #include <QSizeF>
 
+#include <functional>
 #include <memory>
 #include <optional>
 #include <string>
-
-class QQuickItem;
 
 namespace favrin::host {
 
@@ -59,9 +58,13 @@ public:
     virtual QSizeF hostWindowSize() const = 0;
     virtual double keyboardSpace() const = 0;
 
-    virtual void present(PresentationStyle style, QQuickItem &place) = 0;
+    using MakePlace = std::function<std::unique_ptr<PickerPlace>()>;
+
+    /** Nothing happens while one is presented. The place is made when the last one has been left. */
+    virtual void present(const MakePlace &makePlace) = 0;
     virtual void dismiss() = 0;
-    virtual QQuickItem *view() const = 0;
+    /** Where it is presented, or null. */
+    virtual PickerPlace *place() const = 0;
     /** Whether an eyedropper can work here, as far as it is known; the first call starts to find out. */
     virtual bool isEyedropperAvailable() = 0;
 

@@ -1,6 +1,6 @@
-#include "host/serviceahead.h"
+#include "host/session/serviceahead.h"
 
-#include "host/remoteviewsession.h"
+#include "host/session/remoteviewsession.h"
 
 #include <QCoreApplication>
 #include <QPointer>
@@ -22,10 +22,14 @@ ServiceAhead::ServiceAhead() = default;
 
 void ServiceAhead::launch()
 {
-    if (m_launched || m_waiting)
-        return;
+    if (!m_launched && !m_waiting)
+        adopt(launchService(servicePath()));
+}
+
+void ServiceAhead::adopt(LaunchedService service)
+{
     m_launched = std::make_unique<RemoteViewSession>();
-    if (!m_launched->launch().isEmpty())
+    if (!m_launched->adopt(std::move(service)).isEmpty())
         m_launched.reset();
 }
 

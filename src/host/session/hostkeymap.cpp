@@ -1,6 +1,6 @@
-#include "host/hostkeymap.h"
+#include "host/session/hostkeymap.h"
 
-#include "host/compositorkeymap.h"
+#include "host/session/compositorkeymap.h"
 
 #include <QGuiApplication>
 

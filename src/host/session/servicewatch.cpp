@@ -1,6 +1,6 @@
-#include "host/servicewatch.h"
+#include "host/session/servicewatch.h"
 
-#include "host/remoteviewsession.h"
+#include "host/session/remoteviewsession.h"
 
 #include <utility>
 

@@ -1,4 +1,4 @@
-#include "host/picker.h"
+#include "host/session/picker.h"
 
 #include <utility>
 

@@ -1,6 +1,6 @@
-#include "host/clipboardbridge.h"
+#include "host/session/clipboardbridge.h"
 
-#include "host/remoteviewsession.h"
+#include "host/session/remoteviewsession.h"
 #include "remote/clipboardtypes.h"
 
 #include <QClipboard>

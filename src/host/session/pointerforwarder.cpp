@@ -1,6 +1,6 @@
-#include "host/pointerforwarder.h"
+#include "host/session/pointerforwarder.h"
 
-#include "host/remoteviewsession.h"
+#include "host/session/remoteviewsession.h"
 
 #include <QMouseEvent>
 #include <QTouchEvent>

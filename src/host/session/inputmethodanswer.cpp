@@ -1,4 +1,4 @@
-#include "host/inputmethodanswer.h"
+#include "host/session/inputmethodanswer.h"
 
 #include "host/server/remoteviewserver.h"
 

@@ -1,7 +1,8 @@
 #pragma once
 
-#include "host/remotesurface.h"
 #include "host/server/remoteviewserver.h"
+#include "host/session/launchedservice.h"
+#include "host/session/remotesurface.h"
 
 #include <QElapsedTimer>
 #include <QObject>
@@ -31,8 +32,9 @@ public:
 
     /** Starts the process. An error text when that fails, else empty. */
     QString start();
-    /** The two halves of it: the process alone, for which no application is needed; and from then on its server. */
-    QString launch();
+    /** The two halves of it: a process that was started, for which no application is needed; from then on its server.
+     */
+    QString adopt(LaunchedService service);
     void attend();
     /** Closes the connection; no signal follows. */
     void end();

@@ -1,0 +1,63 @@
+#include "host/session/serviceprocess.h"
+
+#include <QSocketNotifier>
+
+#include <csignal>
+
+#include <sys/syscall.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+namespace favrin::host {
+
+namespace {
+
+QString describe(const siginfo_t &info)
+{
+    if (info.si_code == CLD_EXITED)
+        return QStringLiteral("exit status %1").arg(info.si_status);
+    return QStringLiteral("signal %1").arg(info.si_status);
+}
+
+} // namespace
+
+ServiceProcess::ServiceProcess(QObject *parent) : QObject(parent) {}
+
+ServiceProcess::~ServiceProcess()
+{
+    m_notifier.reset();
+    if (m_pidDescriptor >= 0)
+        close(m_pidDescriptor);
+}
+
+void ServiceProcess::adopt(pid_t process)
+{
+    m_pid = process;
+    m_pidDescriptor = static_cast<int>(syscall(SYS_pidfd_open, m_pid, 0));
+}
+
+void ServiceProcess::watch()
+{
+    if (m_pidDescriptor >= 0 && !m_notifier) {
+        m_notifier = std::make_unique<QSocketNotifier>(m_pidDescriptor, QSocketNotifier::Read);
+        connect(m_notifier.get(), &QSocketNotifier::activated, this, &ServiceProcess::reap);
+    }
+}
+
+void ServiceProcess::kill()
+{
+    if (m_pid > 0)
+        ::kill(m_pid, SIGKILL);
+}
+
+void ServiceProcess::reap()
+{
+    siginfo_t info = {};
+    // An app that reaps all children itself leaves nothing to wait for; the process has ended all the same.
+    const bool known = waitid(P_PID, static_cast<id_t>(m_pid), &info, WEXITED | WNOHANG) == 0 && info.si_pid == m_pid;
+    m_pid = 0;
+    m_notifier->setEnabled(false);
+    Q_EMIT ended(known ? describe(info) : QStringLiteral("ended"));
+}
+
+} // namespace favrin::host

@@ -1,0 +1,45 @@
+#pragma once
+
+#include <QObject>
+#include <QString>
+
+#include <memory>
+
+#include <sys/types.h>
+
+class QSocketNotifier;
+
+namespace favrin::host {
+
+/**
+ * One picker process: reaped when it ends, killed when it outlives its welcome. GUI thread. The object may be destroyed
+ * at any time; the process then ends by itself, since its socket is closed.
+ */
+class ServiceProcess : public QObject
+{
+    Q_OBJECT
+
+public:
+    explicit ServiceProcess(QObject *parent = nullptr);
+    ~ServiceProcess() override;
+
+    /** Takes over what was started; watch() tells of its end, when there is an event loop. */
+    void adopt(pid_t process);
+    void watch();
+    /** 0 when nothing runs. */
+    pid_t processIdentifier() const { return m_pid; }
+    void kill();
+
+Q_SIGNALS:
+    /** @p description says how it ended, e.g. "exit status 1" or "signal 9". */
+    void ended(const QString &description);
+
+private:
+    void reap();
+
+    pid_t m_pid = 0;
+    int m_pidDescriptor = -1;
+    std::unique_ptr<QSocketNotifier> m_notifier;
+};
+
+} // namespace favrin::host
