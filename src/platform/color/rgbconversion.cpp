@@ -1,5 +1,6 @@
 #include "platform/color/rgbconversion.h"
 
+#include "platform/color/powertable.h"
 #include "platform/color/primaries.h"
 
 #include <cmath>
@@ -15,6 +16,10 @@ constexpr Chromaticity d65 = {0.3127, 0.3290};
 constexpr Matrix displayP3ToSRGB =
     multiplied(inverse(matrixToXYZ(sRGBPrimaries, d65)), matrixToXYZ(displayP3Primaries, d65));
 constexpr Matrix sRGBToDisplayP3 = inverse(displayP3ToSRGB);
+
+// The curves where they are not straight, which is from 0.09 and from 0.003 on.
+constexpr PowerTable<12, 5, -4> decodingPower;
+constexpr PowerTable<5, 12, -9> encodingPower;
 
 // Both spaces have the same white, so each row sums to one. Written with differences, a row leaves a neutral color
 // alone exactly, whatever the last bits of its entries.
@@ -39,7 +44,10 @@ Triple encoded(const Triple &linear)
 
 double decodedSRGB(double encoded)
 {
-    return encoded <= 0.04045 ? encoded / 12.92 : std::pow((encoded + 0.055) / 1.055, 2.4);
+    if (encoded <= 0.04045)
+        return encoded / 12.92;
+    const double base = (encoded + 0.055) / 1.055;
+    return base <= 1.0 ? decodingPower(base) : std::pow(base, 2.4);
 }
 
 double decodedExtendedSRGB(double encoded)
@@ -51,10 +59,12 @@ double encodedSRGB(double linear)
 {
     if (linear <= 0.0)
         return 0.0;
+    if (linear <= 0.0031308)
+        return 12.92 * linear;
+    if (linear < 1.0)
+        return 1.055 * encodingPower(linear) - 0.055;
     // 1.055 - 0.055 is one bit short of 1: what is clipped to full comes out full.
-    if (linear >= 1.0)
-        return 1.0;
-    return linear <= 0.0031308 ? 12.92 * linear : 1.055 * std::pow(linear, 1.0 / 2.4) - 0.055;
+    return linear >= 1.0 ? 1.0 : linear;
 }
 
 Triple linearDisplayP3ToLinearSRGB(const Triple &linear)
