@@ -39,6 +39,7 @@ Connection::Connection(RemoteViewServerDelegate &delegate)
     , m_logger(wl_display_add_protocol_logger(m_display, messagePassed, this))
     , m_objects([this](const std::string &what) { limitExceeded(what); })
     , m_sharedMemory([this](const std::string &what) { limitExceeded(what); })
+    , m_files([this](const std::string &what) { limitExceeded(what); })
 {
     m_clientListener.notify = clientWillGo;
     wl_display_init_shm(m_display);
@@ -85,6 +86,7 @@ bool Connection::adopt(int socket)
     wl_client_add_destroy_listener(m_client, &m_clientListener);
     m_objects.watch(m_client);
     m_sharedMemory.watch(m_client);
+    m_files.begin();
     return true;
 }
 
@@ -129,7 +131,10 @@ void Connection::endTurn()
 
 void Connection::readOnce()
 {
+    if (m_client)
+        m_files.willRead(wl_client_get_fd(m_client));
     wl_event_loop_dispatch(wl_display_get_event_loop(m_display), 0);
+    m_files.check();
 }
 
 void Connection::flush()
@@ -203,11 +208,13 @@ void Connection::clientWillGo(wl_listener *listener, void *)
 void Connection::messagePassed(void *data, wl_protocol_logger_type direction, const wl_protocol_logger_message *message)
 {
     Connection &self = *static_cast<Connection *>(data);
-    if (direction == WL_PROTOCOL_LOGGER_REQUEST)
+    if (direction == WL_PROTOCOL_LOGGER_REQUEST) {
         self.m_sharedMemory.requestArrived(*message);
-    else if (message->resource && message->message_opcode == WL_DISPLAY_ERROR &&
-             std::string_view(wl_resource_get_class(message->resource)) == "wl_display")
+        self.m_files.requestArrived(*message);
+    } else if (message->resource && message->message_opcode == WL_DISPLAY_ERROR &&
+               std::string_view(wl_resource_get_class(message->resource)) == "wl_display") {
         self.noteError(*message);
+    }
 }
 
 // Errors are posted here, there and by libwayland itself; this is the one place where all of them pass.

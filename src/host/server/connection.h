@@ -1,5 +1,6 @@
 #pragma once
 
+#include "host/server/filemeter.h"
 #include "host/server/objectmeter.h"
 #include "host/server/remoteviewserver.h"
 #include "host/server/resource.h"
@@ -100,6 +101,7 @@ private:
     ClientListener m_clientListener = {{}, this};
     ObjectMeter m_objects;
     ShmMeter m_sharedMemory;
+    FileMeter m_files;
     WeakResource m_limitObject;
     std::array<std::uint32_t, 32> m_inputSerials = {};
     std::size_t m_nextInputSlot = 0;

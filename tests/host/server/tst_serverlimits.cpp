@@ -4,6 +4,7 @@
 
 #include <array>
 #include <functional>
+#include <span>
 
 #include <fcntl.h>
 #include <sys/socket.h>
@@ -41,6 +42,26 @@ std::vector<std::uint32_t> request(std::uint32_t object, std::uint32_t opcode, s
 }
 
 using Words = std::vector<std::uint32_t>;
+
+/** Writes @p data, together with @p count descriptors of one file. */
+template<class Unit>
+void sendFiles(int socket, std::span<const Unit> data, int file, std::size_t count)
+{
+    alignas(cmsghdr) std::array<char, CMSG_SPACE(28 * sizeof(int))> control = {};
+    iovec bytes = {const_cast<Unit *>(data.data()), data.size_bytes()};
+    msghdr message = {};
+    message.msg_iov = &bytes;
+    message.msg_iovlen = 1;
+    message.msg_control = control.data();
+    message.msg_controllen = CMSG_SPACE(count * sizeof(int));
+    cmsghdr *header = CMSG_FIRSTHDR(&message);
+    header->cmsg_level = SOL_SOCKET;
+    header->cmsg_type = SCM_RIGHTS;
+    header->cmsg_len = CMSG_LEN(count * sizeof(int));
+    const std::vector<int> files(count, file);
+    std::memcpy(CMSG_DATA(header), files.data(), count * sizeof(int));
+    QCOMPARE(::sendmsg(socket, &message, MSG_DONTWAIT | MSG_NOSIGNAL), ssize_t(data.size_bytes()));
+}
 
 } // namespace
 
@@ -204,24 +225,32 @@ private Q_SLOTS:
         RecordingDelegate delegate;
         RemoteViewServer server(delegate);
         const int descriptor = server.openConnection();
-        // Six of eight bytes, and a file that no request asks for.
-        std::array<char, 6> half = {1, 0, 0, 0, 0, 0};
-        iovec data = {half.data(), half.size()};
-        alignas(cmsghdr) std::array<char, CMSG_SPACE(sizeof(int))> control = {};
-        msghdr message = {};
-        message.msg_iov = &data;
-        message.msg_iovlen = 1;
-        message.msg_control = control.data();
-        message.msg_controllen = control.size();
-        cmsghdr *header = CMSG_FIRSTHDR(&message);
-        header->cmsg_level = SOL_SOCKET;
-        header->cmsg_type = SCM_RIGHTS;
-        header->cmsg_len = CMSG_LEN(sizeof(int));
-        std::memcpy(CMSG_DATA(header), &descriptor, sizeof descriptor);
-        QCOMPARE(::sendmsg(descriptor, &message, 0), ssize_t(6));
+        // Two bytes of eight, and a file that no request asks for.
+        const std::uint16_t half = 1;
+        sendFiles<std::uint16_t>(descriptor, {&half, 1}, descriptor, 1);
         server.dispatch();
         server.dispatch();
         QVERIFY(delegate.closes.empty());
+        ::close(descriptor);
+    }
+
+    void filesThatNoRequestAsksForAreCounted()
+    {
+        RecordingDelegate delegate;
+        RemoteViewServer server(delegate);
+        const int descriptor = server.openConnection();
+        const int before = OpenFiles::count();
+        int most = 0;
+        for (std::uint32_t id = 2; id < 100 && delegate.closes.empty(); ++id) {
+            const auto words = request(1, 0, 12, {id});
+            sendFiles<std::uint32_t>(descriptor, words, descriptor, 28);
+            server.dispatch();
+            most = std::max(most, OpenFiles::count() - before);
+        }
+        QCOMPARE(delegate.closes.size(), std::size_t(1));
+        QVERIFY(delegate.closes[0].reason == CloseReason::LimitExceeded);
+        // Those of one more message than may be.
+        QVERIFY2(most <= static_cast<int>(limits::strayFiles) + 28, std::to_string(most).c_str());
         ::close(descriptor);
     }
 
