@@ -1,6 +1,6 @@
 #include "lens/colorlens.h"
 
-#include "platform/shapes/dropshadow.h"
+#include "lens/lenspicture.h"
 #include "service/displaycolor.h"
 #include "theme/theme.h"
 
@@ -21,18 +21,6 @@ constexpr double shadowBlurRadius = 2.0;
 constexpr double shadowOpacity = 0.33;
 /** How far the shadow can be seen beyond the ring, less the padding. */
 constexpr double reach = 1.5 * shadowBlurRadius - padding;
-
-QImage disc(QSize imageSize, const QRectF &circle, const QColor &color)
-{
-    QImage image(imageSize, QImage::Format_ARGB32_Premultiplied);
-    image.fill(Qt::transparent);
-    QPainter painter(&image);
-    painter.setRenderHint(QPainter::Antialiasing);
-    painter.setPen(Qt::NoPen);
-    painter.setBrush(color);
-    painter.drawEllipse(circle);
-    return image;
-}
 
 } // namespace
 
@@ -60,16 +48,18 @@ void ColorLens::paint(QPainter &painter, QSize size, double devicePixelRatio)
     const double inset = ringWidth * devicePixelRatio;
     QRectF circle(0.0, 0.0, diameter, diameter);
     circle.moveCenter(QRectF(QPointF(margin, margin), QSizeF(size)).center());
-
-    const QImage ring =
-        disc(size.grownBy({margin, margin, margin, margin}), circle, Theme::instance().systemBackground());
     QColor shadow = DisplayColor::instance().interfaceColor(Qt::black);
     shadow.setAlphaF(shadowOpacity);
-    painter.drawImage(-margin, -margin, platform::dropShadow(ring, shadowBlurRadius * devicePixelRatio, shadow));
-    painter.drawImage(-margin, -margin, ring);
-    painter.setPen(Qt::NoPen);
-    painter.setBrush(DisplayColor::instance().color(m_color));
-    painter.drawEllipse(circle.translated(-margin, -margin).adjusted(inset, inset, -inset, -inset));
+
+    const LensFrame frame = {.size = size.grownBy({margin, margin, margin, margin}),
+                             .circle = circle,
+                             .shadowBlurRadius = shadowBlurRadius * devicePixelRatio,
+                             .ring = Theme::instance().systemBackground(),
+                             .shadow = shadow};
+    const QImage picture = image(LensPicture{.frame = frame,
+                                             .disc = circle.adjusted(inset, inset, -inset, -inset),
+                                             .color = DisplayColor::instance().color(m_color)});
+    painter.drawImage(-margin, -margin, picture);
 }
 
 } // namespace favrin::lens
