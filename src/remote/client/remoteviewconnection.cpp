@@ -5,6 +5,7 @@
 #include "remote/wirecolor.h"
 
 #include <cstring>
+#include <thread>
 #include <utility>
 
 namespace favrin::remote::client {
@@ -131,6 +132,9 @@ void RemoteViewConnection::pickerDidSelectColor(const std::optional<platform::Co
     favrin_remote_view_v1_picker_did_select_color(d->view, &array, wireText(wire->space), wireText(colorspace),
                                                   isVolatile);
     d->flush();
+    // The message has woken the host, often on the very processor that is busy here, and the frame that follows would
+    // keep it waiting.
+    std::this_thread::yield();
 }
 
 void RemoteViewConnection::pickerDidShowEyedropper()
