@@ -1,6 +1,7 @@
 #include "chaoshost.h"
 
 #include <QFile>
+#include <QProcess>
 
 /** A process that does not answer is noticed and can be replaced; one that is slow is left alone. */
 class HangingServiceTest : public QObject
@@ -45,6 +46,63 @@ private Q_SLOTS:
         QVERIFY(slow.isReady());
         slow.click(slow.swatch(0, 0));
         QTRY_VERIFY(!slow.picks.empty());
+    }
+
+    void oneThatStopsInTheMiddleOfADragGoesOn_data()
+    {
+        QTest::addColumn<int>("standstill");
+        // What happens meanwhile waits in the host, or is left out. The last one is noticed.
+        for (const int milliseconds : {100, 500, 1500, 5000})
+            QTest::addRow("%d ms", milliseconds) << milliseconds;
+    }
+
+    void oneThatStopsInTheMiddleOfADragGoesOn()
+    {
+        QFETCH(int, standstill);
+        ChaosHost host;
+        const pid_t process = presented(host);
+        QVERIFY(process > 0);
+        host.click(host.swatch(9, 3));
+        QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+        const FVColor expected = host.picks.back().color;
+        QTest::mousePress(&host.window, Qt::LeftButton, {}, host.swatch(0, 0));
+        QTRY_VERIFY(host.picks.back().isVolatile);
+        QCOMPARE(kill(process, SIGSTOP), 0);
+        const auto reported = host.picks.size();
+        {
+            const SignalSoon wakesUp(process, SIGCONT, std::chrono::milliseconds(standstill));
+            QElapsedTimer time;
+            time.start();
+            for (int step = 0; time.elapsed() < standstill; ++step) {
+                host.dragStep(step);
+                QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents | QEventLoop::AllEvents, 1);
+            }
+        }
+        QTRY_VERIFY(host.picks.size() > reported);
+        QTest::mouseMove(&host.window, host.swatch(9, 3));
+        QTest::mouseRelease(&host.window, Qt::LeftButton, {}, host.swatch(9, 3));
+        QTRY_VERIFY(!host.picks.back().isVolatile);
+        QCOMPARE(host.picks.back().color, expected);
+        QVERIFY(host.isReady() && host.terminated.isEmpty());
+        QTRY_VERIFY(host.picker.isResponding());
+    }
+
+    void nobodyIsBlamedForAStandstillOfTheApp()
+    {
+        ChaosHost host;
+        QVERIFY(presented(host) > 0);
+        QSignalSpy reports(&host.picker, &FVColorPickerViewController::respondingChanged);
+        QTest::mousePress(&host.window, Qt::LeftButton, {}, host.swatch(0, 0));
+        host.dragStep(1);
+        // Longer than the watch waits for an answer.
+        QProcess stopper;
+        stopper.start(QStringLiteral("sh"), {QStringLiteral("-c"), QStringLiteral("kill -STOP $PPID; sleep 5; "
+                                                                                  "kill -CONT $PPID")});
+        QVERIFY(stopper.waitForFinished(patience));
+        host.dragStep(2);
+        QTest::mouseRelease(&host.window, Qt::LeftButton, {}, host.swatch(9, 3));
+        QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+        QVERIFY(reports.isEmpty() && host.terminated.isEmpty());
     }
 
     void oneThatHangsAtItsStartIsNoticed()
