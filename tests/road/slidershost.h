@@ -77,13 +77,7 @@ private:
                               : first + static_cast<int>(row) * (titleHeight() + height + 18);
     }
     double hexMiddle() const { return 3 * (titleHeight() + height) + 2 * 18 + 25 + height / 2; }
-    /** @p x runs in reading direction. */
-    QPoint placeAt(double x, double y) const
-    {
-        const QRectF area = tabArea();
-        const bool isMirrored = picker.layoutDirection() == Qt::RightToLeft;
-        return inTab((isMirrored ? area.width() - x : x) / area.width(), y / area.height());
-    }
+    QPoint placeAt(double x, double y) const { return inTab(x / tabArea().width(), y / tabArea().height()); }
 
     int m_besideMiddle = 12;
 };

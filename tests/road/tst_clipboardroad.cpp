@@ -1,11 +1,11 @@
-#include "roadhost.h"
+#include "roadtest.h"
 
 #include <QClipboard>
 #include <QGuiApplication>
 #include <QMimeData>
 
 /** What the user copies in the picker, as other apps get it from the host. */
-class ClipboardRoadTest : public QObject
+class ClipboardRoadTest : public RoadTest
 {
     Q_OBJECT
 

@@ -1,4 +1,4 @@
-#include "roadhost.h"
+#include "roadtest.h"
 
 using State = FVColorPickerViewController::State;
 
@@ -38,7 +38,7 @@ constexpr int stops = 7;
 } // namespace
 
 /** The keyboard focus on its way between the elements of an app and those of the picker. */
-class FocusRoadTest : public QObject
+class FocusRoadTest : public RoadTest
 {
     Q_OBJECT
 

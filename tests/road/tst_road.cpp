@@ -1,71 +1,41 @@
-#include "roadhost.h"
+#include "roadtest.h"
 
 #include <QGuiApplication>
 #include <QProcess>
-#include <QTemporaryDir>
-
-#include <limits>
 
 using State = FVColorPickerViewController::State;
 
 /** From the app to the picker's process and back, all of it real: only the display is missing. */
-class RoadTest : public QObject
+class PickerRoadTest : public RoadTest
 {
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase();
-    void cleanup();
-
     void aTouchDragGivesVolatilePicksAndOneFinal();
     void aMouseDragThatLeavesThePickerGoesOn();
     void theHostsColorComesBackBitForBitAndIsNotEchoed_data();
     void theHostsColorComesBackBitForBitAndIsNotEchoed();
-    void keysPickFinalColors();
     void theUserEndsThePresentation_data();
     void theUserEndsThePresentation();
     void theAppEndsThePresentation();
     void aGestureThatTheEndCutsOffIsMadeFinal();
     void anEmbeddedPickerFillsItsContainer();
     void nothingIsDrawnWhileTheAppHidesThePicker();
-    void aKilledServiceIsReportedAndPresentingAgainWorks();
     void aServiceThatCannotRunIsReported_data();
     void aServiceThatCannotRunIsReported();
-    void theHostsDeathEndsTheService();
     void aServiceStartedAheadIsTheOneThatIsShown();
     void aWideDisplayIsDrawnAndPickedInDisplayP3();
-    void anAbsurdRecordLeavesASanePicker();
     void theWindowMayGoWhileThePickerIsShown();
-
-private:
-    QTemporaryDir m_data;
-    const QPointingDevice *m_touchScreen = QTest::createTouchDevice();
 };
 
-void RoadTest::initTestCase()
-{
-    // The service's user defaults are its own here.
-    QVERIFY(m_data.isValid());
-    qputenv("FAVRIN_DEFAULTS_FILE", (m_data.path() + QStringLiteral("/defaults.sqlite")).toUtf8());
-    QVERIFY2(QFileInfo(FVColorPickerViewController::servicePath()).isExecutable(),
-             qPrintable(FVColorPickerViewController::servicePath()));
-}
-
-void RoadTest::cleanup()
-{
-    qunsetenv("FAVRIN_COLOR_PICKER_SERVICE");
-    // Whatever a test presented has left before the next one starts.
-    QTRY_VERIFY(servicesOf(getpid()).empty());
-}
-
-void RoadTest::aTouchDragGivesVolatilePicksAndOneFinal()
+void PickerRoadTest::aTouchDragGivesVolatilePicksAndOneFinal()
 {
     RoadHost host;
     host.picker.setSelectedColor(FVColor(0.25, 0.5, 0.75, 0.5));
     host.picker.present(&host.window);
     QTRY_VERIFY(host.isReady());
 
-    auto touch = QTest::touchEvent(&host.window, const_cast<QPointingDevice *>(m_touchScreen), false);
+    auto touch = QTest::touchEvent(&host.window, const_cast<QPointingDevice *>(touchScreen()), false);
     touch.press(0, host.swatch(3, 5)).commit();
     QTRY_VERIFY(!host.picks.empty());
     for (int column = 6; column < 10; ++column) {
@@ -87,7 +57,7 @@ void RoadTest::aTouchDragGivesVolatilePicksAndOneFinal()
     QCOMPARE(host.picker.selectedColor(), last.color);
 }
 
-void RoadTest::aMouseDragThatLeavesThePickerGoesOn()
+void PickerRoadTest::aMouseDragThatLeavesThePickerGoesOn()
 {
     RoadHost host;
     host.picker.present(&host.window);
@@ -99,7 +69,7 @@ void RoadTest::aMouseDragThatLeavesThePickerGoesOn()
     QCOMPARE(host.picks.back().color, FVColor(0, 0, 0));
 }
 
-void RoadTest::theHostsColorComesBackBitForBitAndIsNotEchoed_data()
+void PickerRoadTest::theHostsColorComesBackBitForBitAndIsNotEchoed_data()
 {
     QTest::addColumn<FVColor>("color");
     QTest::newRow("sRGB, odd bits") << FVColor(0.1 + 0.2, 1.0 / 3.0, 5e-324, 0.123456789012345678);
@@ -107,7 +77,7 @@ void RoadTest::theHostsColorComesBackBitForBitAndIsNotEchoed_data()
     QTest::newRow("fully transparent") << FVColor(1, 1, 1, 0);
 }
 
-void RoadTest::theHostsColorComesBackBitForBitAndIsNotEchoed()
+void PickerRoadTest::theHostsColorComesBackBitForBitAndIsNotEchoed()
 {
     QFETCH(FVColor, color);
     RoadHost host;
@@ -129,25 +99,7 @@ void RoadTest::theHostsColorComesBackBitForBitAndIsNotEchoed()
     QCOMPARE(host.picks.back().color.alpha(), color.alpha());
 }
 
-void RoadTest::keysPickFinalColors()
-{
-    RoadHost host;
-    host.picker.present(&host.window);
-    QTRY_VERIFY(host.isReady());
-    QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.swatch(0, 0));
-    QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
-    const auto before = host.picks.size();
-
-    QTest::keyClick(&host.window, Qt::Key_Right);
-    QTRY_COMPARE(host.picks.size(), before + 1);
-    QCOMPARE(host.picks.back().color, FVColor(0xEB / 255.0, 0xEB / 255.0, 0xEB / 255.0));
-    QTest::keyClick(&host.window, Qt::Key_Down);
-    QTRY_COMPARE(host.picks.size(), before + 2);
-    QCOMPARE(host.picks.back().color, FVColor(0x01 / 255.0, 0x1D / 255.0, 0x57 / 255.0));
-    QVERIFY(!host.picks.back().isVolatile);
-}
-
-void RoadTest::theUserEndsThePresentation_data()
+void PickerRoadTest::theUserEndsThePresentation_data()
 {
     QTest::addColumn<QString>("how");
     QTest::newRow("close button") << QStringLiteral("close");
@@ -155,7 +107,7 @@ void RoadTest::theUserEndsThePresentation_data()
     QTest::newRow("click beside a popover") << QStringLiteral("popover");
 }
 
-void RoadTest::theUserEndsThePresentation()
+void PickerRoadTest::theUserEndsThePresentation()
 {
     QFETCH(QString, how);
     RoadHost host;
@@ -179,7 +131,7 @@ void RoadTest::theUserEndsThePresentation()
     QVERIFY(!host.picker.view());
 }
 
-void RoadTest::theAppEndsThePresentation()
+void PickerRoadTest::theAppEndsThePresentation()
 {
     RoadHost host;
     QSignalSpy finished(&host.picker, &FVColorPickerViewController::colorPickerDidFinish);
@@ -195,7 +147,7 @@ void RoadTest::theAppEndsThePresentation()
     QVERIFY(host.picks.empty());
 }
 
-void RoadTest::aGestureThatTheEndCutsOffIsMadeFinal()
+void PickerRoadTest::aGestureThatTheEndCutsOffIsMadeFinal()
 {
     RoadHost host;
     QSignalSpy finished(&host.picker, &FVColorPickerViewController::colorPickerDidFinish);
@@ -210,7 +162,7 @@ void RoadTest::aGestureThatTheEndCutsOffIsMadeFinal()
     QTest::mouseRelease(&host.window, Qt::LeftButton, {}, QPoint(5, 5));
 }
 
-void RoadTest::anEmbeddedPickerFillsItsContainer()
+void PickerRoadTest::anEmbeddedPickerFillsItsContainer()
 {
     RoadHost host;
     QQuickItem container(host.window.contentItem());
@@ -228,31 +180,7 @@ void RoadTest::anEmbeddedPickerFillsItsContainer()
     QTRY_COMPARE(host.picks.back().color, FVColor(1, 1, 1));
 }
 
-void RoadTest::aKilledServiceIsReportedAndPresentingAgainWorks()
-{
-    RoadHost host;
-    QSignalSpy terminated(&host.picker, &FVColorPickerViewController::colorPickerViewServiceDidTerminateWithError);
-    QSignalSpy finished(&host.picker, &FVColorPickerViewController::colorPickerDidFinish);
-    for (int round = 1; round <= 3; ++round) {
-        host.picks.clear();
-        host.picker.present(&host.window);
-        QTRY_VERIFY(host.isReady());
-        QTest::mousePress(&host.window, Qt::LeftButton, {}, host.swatch(2, 2));
-        QTRY_VERIFY(!host.picks.empty());
-        const auto services = servicesOf(getpid());
-        QCOMPARE(services.size(), std::size_t(1));
-        kill(services[0], SIGKILL);
-        QTest::mouseMove(&host.window, host.swatch(5, 5));
-        QTRY_COMPARE(terminated.size(), round);
-        QCOMPARE(host.picker.state(), State::Failed);
-        QVERIFY(!terminated.back().at(0).toString().isEmpty());
-        QVERIFY(!host.picker.view());
-        QTest::mouseRelease(&host.window, Qt::LeftButton, {}, QPoint(5, 5));
-    }
-    QVERIFY(finished.isEmpty());
-}
-
-void RoadTest::nothingIsDrawnWhileTheAppHidesThePicker()
+void PickerRoadTest::nothingIsDrawnWhileTheAppHidesThePicker()
 {
     RoadHost host;
     QQuickItem container(host.window.contentItem());
@@ -281,7 +209,7 @@ void RoadTest::nothingIsDrawnWhileTheAppHidesThePicker()
     QTRY_VERIFY(shows(qRgb(255, 0, 0)));
 }
 
-void RoadTest::aServiceThatCannotRunIsReported_data()
+void PickerRoadTest::aServiceThatCannotRunIsReported_data()
 {
     QTest::addColumn<QByteArray>("program");
     QTest::newRow("missing") << QByteArray("/nonexistent/service");
@@ -289,7 +217,7 @@ void RoadTest::aServiceThatCannotRunIsReported_data()
     QTest::newRow("no program") << QByteArray("/etc/passwd");
 }
 
-void RoadTest::aServiceThatCannotRunIsReported()
+void PickerRoadTest::aServiceThatCannotRunIsReported()
 {
     QFETCH(QByteArray, program);
     qputenv("FAVRIN_COLOR_PICKER_SERVICE", program);
@@ -300,22 +228,7 @@ void RoadTest::aServiceThatCannotRunIsReported()
     QCOMPARE(host.picker.state(), State::Failed);
 }
 
-void RoadTest::theHostsDeathEndsTheService()
-{
-    QProcess host;
-    host.start(QCoreApplication::applicationFilePath(), {QStringLiteral("--host")});
-    QVERIFY(host.waitForStarted());
-    const auto parent = static_cast<pid_t>(host.processId());
-    QByteArray output;
-    QTRY_VERIFY((output += host.readAllStandardOutput()).contains("ready"));
-    const auto services = servicesOf(parent);
-    QCOMPARE(services.size(), std::size_t(1));
-    host.kill();
-    QVERIFY(host.waitForFinished());
-    QTRY_VERIFY(!QFileInfo::exists(QStringLiteral("/proc/%1/exe").arg(services[0])));
-}
-
-void RoadTest::aServiceStartedAheadIsTheOneThatIsShown()
+void PickerRoadTest::aServiceStartedAheadIsTheOneThatIsShown()
 {
     FVColorPickerViewController::startServiceAhead();
     FVColorPickerViewController::startServiceAhead();
@@ -334,7 +247,7 @@ void RoadTest::aServiceStartedAheadIsTheOneThatIsShown()
     QCOMPARE(host.picks.back().color, FVColor(0, 0, 0));
 }
 
-void RoadTest::aWideDisplayIsDrawnAndPickedInDisplayP3()
+void PickerRoadTest::aWideDisplayIsDrawnAndPickedInDisplayP3()
 {
     RoadHost host;
     host.picker.setDisplayGamut(FVColorPickerViewController::DisplayGamut::P3);
@@ -354,28 +267,7 @@ void RoadTest::aWideDisplayIsDrawnAndPickedInDisplayP3()
     QTRY_COMPARE(host.window.grabWindow().pixel(swatch), expected.rgb());
 }
 
-void RoadTest::anAbsurdRecordLeavesASanePicker()
-{
-    RoadHost host;
-    host.picker.setTitle(QString(100'000, QChar(u'ä')));
-    host.picker.setHostWindowSize(QSizeF(std::numeric_limits<double>::quiet_NaN(), -1e308));
-    host.picker.setKeyboardSpace(std::numeric_limits<double>::infinity());
-    host.picker.setSuggestedColors(QList<FVColor>(5000, FVColor(-1e300, 2, 1e300, -7)));
-    host.picker.setGridAppearance(static_cast<FVColorPickerViewController::Appearance>(77));
-    host.picker.setTextSizeCategory(static_cast<FVColorPickerViewController::TextSizeCategory>(-5));
-    host.picker.present(&host.window);
-    QTRY_VERIFY(host.isReady());
-    // Sane again, it works as ever.
-    host.picker.setKeyboardSpace(0);
-    host.picker.resetHostWindowSize();
-    QTRY_COMPARE(host.picker.preferredContentSize().width(), 568.0);
-    QTRY_COMPARE(host.picker.view()->width(), 568.0);
-    QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.swatch(0, 11));
-    QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
-    QCOMPARE(host.picks.back().color, FVColor(0, 0, 0));
-}
-
-void RoadTest::theWindowMayGoWhileThePickerIsShown()
+void PickerRoadTest::theWindowMayGoWhileThePickerIsShown()
 {
     FVColorPickerViewController picker;
     QSignalSpy finished(&picker, &FVColorPickerViewController::colorPickerDidFinish);
@@ -399,6 +291,7 @@ void say(const QString &line)
 int runAsHost(int argc, char *argv[])
 {
     QGuiApplication application(argc, argv);
+    QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
     RoadHost host;
     QObject::connect(&host.picker, &FVColorPickerViewController::stateChanged, &host.window, [&host] {
         if (host.isReady())
@@ -422,11 +315,10 @@ int runAsHost(int argc, char *argv[])
 
 int main(int argc, char *argv[])
 {
-    QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
     if (argc > 1 && qstrcmp(argv[1], "--host") == 0)
         return runAsHost(argc, argv);
     QGuiApplication application(argc, argv);
-    RoadTest test;
+    PickerRoadTest test;
     return QTest::qExec(&test, argc, argv);
 }
 
