@@ -1,10 +1,12 @@
 #include "platform/queue/queue.h"
 
 #include <QCoreApplication>
+#include <QEvent>
 #include <QThreadPool>
 
 #include <cstddef>
 #include <deque>
+#include <memory>
 #include <mutex>
 #include <utility>
 
@@ -62,6 +64,22 @@ private:
     std::deque<Work> m_work;
 };
 
+/** Lives on the main thread. Of the events it looks only at their number, since they are made on other threads. */
+class MainThread : public QObject
+{
+public:
+    explicit MainThread(WaitingWork &waiting) : m_waiting(waiting)
+    {
+        moveToThread(QCoreApplication::instance()->thread());
+    }
+
+protected:
+    void customEvent(QEvent *) override { m_waiting.runNext(); }
+
+private:
+    WaitingWork &m_waiting;
+};
+
 class MainQueue : public Queue
 {
 public:
@@ -79,6 +97,7 @@ public:
     {
         const std::lock_guard guard(m_mutex);
         m_phase = Phase::Running;
+        m_mainThread = std::make_unique<MainThread>(m_waiting);
         for (std::size_t waiting = m_waiting.size(); waiting > 0; --waiting)
             post();
     }
@@ -88,6 +107,7 @@ public:
         {
             const std::lock_guard guard(m_mutex);
             m_phase = Phase::AfterApplication;
+            m_mainThread.reset();
         }
         m_waiting.drop();
     }
@@ -95,17 +115,14 @@ public:
 private:
     enum class Phase { BeforeApplication, Running, AfterApplication };
 
-    // The application object is the receiver: its thread is the main thread, and one receiver keeps the order.
-    void post()
-    {
-        QMetaObject::invokeMethod(
-            QCoreApplication::instance(), [this] { m_waiting.runNext(); }, Qt::QueuedConnection);
-    }
+    // One receiver keeps the order.
+    void post() { QCoreApplication::postEvent(m_mainThread.get(), new QEvent(QEvent::User)); }
 
     // Held while posting, so that the application cannot go away in between.
     std::mutex m_mutex;
     Phase m_phase = Phase::BeforeApplication;
     WaitingWork m_waiting;
+    std::unique_ptr<MainThread> m_mainThread;
 };
 
 class BackgroundQueue : public Queue
