@@ -9,6 +9,8 @@
 #include <QGuiApplication>
 #include <QJsonObject>
 #include <QMouseEvent>
+#include <QQuickItem>
+#include <QQuickWindow>
 #include <QTimer>
 
 #include <algorithm>
@@ -160,6 +162,25 @@ public:
     }
 
     FVColorPickerViewController &picker() { return m_picker; }
+    QQuickWindow &window() { return m_window; }
+    /** How many the window has shown. */
+    int frames() const { return m_frames; }
+
+    /** Moves the focus on until a caret blinks. */
+    bool focusTextField()
+    {
+        m_picker.view()->forceActiveFocus();
+        for (int i = 0; i < mostElements; ++i) {
+            if (m_picker.view()->flags().testFlag(QQuickItem::ItemAcceptsInputMethod))
+                return true;
+            for (const auto type : {QEvent::KeyPress, QEvent::KeyRelease}) {
+                QKeyEvent event(type, Qt::Key_Tab, Qt::NoModifier, tabKeyCode, 0, 0);
+                QCoreApplication::sendEvent(&m_window, &event);
+            }
+            rest(100);
+        }
+        return false;
+    }
 
     /** @param place of a step's number: fractions of the tab's width and height, never the same twice in a row */
     bool drag(Samples &messages, Samples &frames, const std::function<QPointF(int)> &place)
@@ -191,6 +212,18 @@ public:
         return true;
     }
 
+    void beginDrag() { send(QEvent::MouseButtonPress, placeOnTheWay(0)); }
+    /** Steps as fast as they can be sent, until the picker has answered one of them. The way is a line there and back.
+     */
+    bool dragSome(int steps)
+    {
+        const int picks = m_picks;
+        for (int step = 0; step < steps; ++step)
+            send(QEvent::MouseMove, placeOnTheWay(++m_dragStep));
+        return waitFor([&] { return m_picks > picks; });
+    }
+    void endDrag() { send(QEvent::MouseButtonRelease, placeOnTheWay(m_dragStep)); }
+
     void memory(Samples &proportional, Samples &peak)
     {
         const auto pid = servicePid();
@@ -206,6 +239,10 @@ public:
     }
 
 private:
+    QPointF placeOnTheWay(int step) const
+    {
+        return m_picker.view()->mapToScene(QPointF(padding + 20 + step * 7 % 101, 120 + step * 13 % 97));
+    }
     void click(int tab)
     {
         const auto *view = m_picker.view();
@@ -223,12 +260,16 @@ private:
 
     /** On either side of what the picker shows. */
     static constexpr double padding = 20;
+    static constexpr int mostElements = 20;
+    /** As X counts keys. */
+    static constexpr quint32 tabKeyCode = 23;
 
     QQuickWindow m_window;
     FVColorPickerViewController m_picker;
     int m_frames = 0;
     int m_framesAtReady = 0;
     int m_picks = 0;
+    int m_dragStep = 0;
 };
 
 } // namespace favrin::bench

@@ -1,16 +1,18 @@
 // Times what changes while a picker is shown, and what grows: the first frame with each tab saved as the last one, the
-// switch of tabs, the window's other size, suggested colors, and many presentations in one host with what they leave
-// behind. One JSON object is printed.
+// switch of tabs, the window's other size, numbers of suggested colors, and many presentations in one host and many
+// steps of one drag with what they leave behind. One JSON object is printed.
 //
-// usage: favrin-bench-changing [rounds [presentations]]
+// usage: favrin-bench-changing [rounds [presentations [drag steps]]]
 
 #include "host/benchhost.h"
 
 #include <QDir>
+#include <QJsonArray>
 #include <QJsonDocument>
 #include <QTemporaryDir>
 
 #include <array>
+#include <cstdlib>
 
 using namespace favrin::bench;
 
@@ -20,6 +22,12 @@ constexpr std::array<const char *, 3> tabNames = {
     "first frame with the grid saved", "first frame with the spectrum saved", "first frame with the sliders saved"};
 constexpr std::array<const char *, 3> switchNames = {"switch to the grid", "switch to the spectrum",
                                                      "switch to the sliders"};
+
+struct Suggestions
+{
+    int count;
+    Samples frames;
+};
 
 std::vector<Samples> samplesOf(const std::array<const char *, 3> &names)
 {
@@ -59,52 +67,83 @@ bool sizes(BenchHost &host, Samples &rotation, int rounds)
     return host.finish();
 }
 
-bool suggestions(BenchHost &host, Samples &without, Samples &with, int rounds)
+QList<FVColor> suggestedColors(int count)
 {
     QList<FVColor> colors;
-    for (int i = 0; i < 1000; ++i)
+    for (int i = 0; i < count; ++i)
         colors.append(FVColor(double(i % 10) / 10, double(i / 10 % 10) / 10, double(i / 100) / 10));
+    return colors;
+}
+
+bool suggestions(BenchHost &host, std::array<Suggestions, 4> &numbers, int rounds)
+{
     for (int round = 0; round < rounds; ++round) {
-        host.picker().setSuggestedColors({});
-        if (!host.present(without, false) || !host.finish())
-            return false;
-        host.picker().setSuggestedColors(colors);
-        if (!host.present(with, false) || !host.finish())
-            return false;
+        for (auto &[count, frames] : numbers) {
+            host.picker().setSuggestedColors(suggestedColors(count));
+            if (!host.present(frames, false) || !host.finish())
+                return false;
+        }
     }
     host.picker().setSuggestedColors({});
     return true;
 }
 
-qsizetype openHandles()
+qsizetype openHandles(qint64 process)
 {
-    return QDir(QStringLiteral("/proc/self/fd"))
+    return QDir(QStringLiteral("/proc/%1/fd").arg(process))
         .entryList(QDir::NoDotAndDotDot | QDir::AllEntries | QDir::System)
         .size();
 }
 
-QJsonObject holdings()
+/** What a process holds after so much of something. */
+QJsonObject holdings(qint64 process, int count)
 {
-    return {{QStringLiteral("private_mb"),
-             processMemory(QCoreApplication::applicationPid(), "Private_Dirty:", "smaps_rollup")},
-            {QStringLiteral("handles"), openHandles()}};
+    const auto memory = [process](const char *field) { return processMemory(process, field, "smaps_rollup"); };
+    return {{QStringLiteral("count"), count},
+            {QStringLiteral("private_mb"), memory("Private_Dirty:") + memory("Private_Clean:")},
+            {QStringLiteral("pss_mb"), memory("Pss:")},
+            {QStringLiteral("handles"), openHandles(process)}};
 }
 
-/** Presents again and again. The first ones fill caches, so what grows is counted from the tenth part on. */
-bool manyPresentations(BenchHost &host, int count, QJsonObject &report)
+/** After every tenth part. */
+bool isLookedAt(int done, int count)
 {
-    Samples times{"present to first frame, again and again", "ms"};
-    for (int i = 0; i < count; ++i) {
+    return done % std::max(1, count / 10) == 0;
+}
+
+bool manyPresentations(BenchHost &host, int count, QJsonArray &points)
+{
+    Samples times{"", ""};
+    for (int done = 1; done <= count; ++done) {
         if (!host.present(times, false) || !host.finish())
             return false;
-        if (i + 1 == std::max(1, count / 10))
-            report[QStringLiteral("after the first tenth")] = holdings();
+        if (isLookedAt(done, count)) {
+            // Processes that leave are reaped, and what is to be deleted is.
+            BenchHost::rest(300);
+            points.append(holdings(QCoreApplication::applicationPid(), done));
+        }
     }
-    BenchHost::rest(500);
-    report[QStringLiteral("count")] = count;
-    report[QStringLiteral("after all")] = holdings();
-    report[QStringLiteral("times")] = times.report();
     return true;
+}
+
+/** One drag in the spectrum, as fast as the picker takes it. */
+bool manySteps(BenchHost &host, int count, QJsonArray &points)
+{
+    constexpr int spectrum = 1;
+    constexpr int batch = 100;
+    Samples unused{"", ""};
+    if (!host.present(unused, false))
+        return false;
+    host.choose(spectrum);
+    host.beginDrag();
+    for (int done = batch; done <= count; done += batch) {
+        if (!host.dragSome(batch))
+            return false;
+        if (isLookedAt(done, count))
+            points.append(holdings(servicePid(), done));
+    }
+    host.endDrag();
+    return host.finish();
 }
 
 } // namespace
@@ -117,29 +156,43 @@ int main(int argc, char *argv[])
         qputenv("QT_QPA_PLATFORM", "offscreen");
     QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
     QGuiApplication application(argc, argv);
-    const int rounds = argc > 1 ? std::max(1, atoi(argv[1])) : 5;
-    const int presentations = argc > 2 ? atoi(argv[2]) : 500;
+    const auto argument = [&](int place, int usual) { return argc > place ? std::atoi(argv[place]) : usual; };
+    const int rounds = std::max(1, argument(1, 5));
+    const int presentations = argument(2, 500);
+    const int steps = argument(3, 100'000);
 
     BenchHost host;
     auto frames = samplesOf(tabNames);
     auto switches = samplesOf(switchNames);
     Samples rotation{"window's other size to settled frame", "ms"};
-    Samples without{"present to first frame, no suggested colors", "ms"};
-    Samples with{"present to first frame, 1000 suggested colors", "ms"};
-    QJsonObject report;
-    if (!firstFrames(host, frames, switches, rounds) || !sizes(host, rotation, rounds) ||
-        !suggestions(host, without, with, rounds))
+    std::array<Suggestions, 4> numbers = {{
+        {0, {"present to first frame, no suggested colors", "ms"}},
+        {10, {"present to first frame, 10 suggested colors", "ms"}},
+        {100, {"present to first frame, 100 suggested colors", "ms"}},
+        {1000, {"present to first frame, 1000 suggested colors", "ms"}},
+    }};
+    QJsonArray afterPresentations;
+    QJsonArray afterSteps;
+    const char *failed = !firstFrames(host, frames, switches, rounds)                  ? "first frames"
+                         : !sizes(host, rotation, rounds)                              ? "sizes"
+                         : !suggestions(host, numbers, rounds)                         ? "suggested colors"
+                         : !manyPresentations(host, presentations, afterPresentations) ? "presentations"
+                         : !manySteps(host, steps, afterSteps)                         ? "drag steps"
+                                                                                       : nullptr;
+    if (failed) {
+        std::fprintf(stderr, "failed: %s\n", failed);
         return 1;
+    }
+    QJsonObject report;
     for (auto *list : {&frames, &switches}) {
         for (auto &samples : *list)
             report[QLatin1String(samples.name)] = samples.report();
     }
-    for (auto *samples : {&rotation, &without, &with})
-        report[QLatin1String(samples->name)] = samples->report();
-    QJsonObject growth;
-    if (presentations > 0 && !manyPresentations(host, presentations, growth))
-        return 1;
-    report[QStringLiteral("presentations")] = growth;
+    report[QLatin1String(rotation.name)] = rotation.report();
+    for (auto &[count, samples] : numbers)
+        report[QLatin1String(samples.name)] = samples.report();
+    report[QStringLiteral("after presentations")] = afterPresentations;
+    report[QStringLiteral("after drag steps")] = afterSteps;
     std::printf("%s\n", QJsonDocument(report).toJson(QJsonDocument::Compact).constData());
     return 0;
 }

@@ -1,5 +1,6 @@
 // Starts a program and says when its window is first painted, as seen on the X display: the first damage after which a
 // top-level window holds eight colors. Then lets it rest and reads what its processes hold. One JSON object is printed.
+// With --idle it goes on: what an opening sets going has time to end, and what happens from then on is counted.
 //
 // usage: watch-window [--idle SECONDS] PROGRAM [ARGUMENT...]
 
@@ -35,6 +36,8 @@ using namespace std::chrono_literals;
 
 constexpr auto patience = 20s;
 constexpr auto restTime = 600ms;
+/** An opening asks the picker once more some seconds later, and threads that Qt kept ready end after thirty. */
+constexpr auto settleTime = 35s;
 constexpr std::size_t colorsOfAPicture = 8;
 constexpr int smallestDialog = 100;
 
@@ -156,6 +159,13 @@ Footprint footprint(pid_t process)
     return result;
 }
 
+/** When a window was first painted: since the start of its program, and on the clock of the day in seconds. */
+struct Painted
+{
+    double milliseconds = 0;
+    double at = 0;
+};
+
 using Sleeps = std::map<std::string, long>;
 
 /** How often each thread of a process has gone to sleep. */
@@ -169,12 +179,14 @@ Sleeps sleeps(pid_t process)
     return counts;
 }
 
-/** Of the threads that are still there. */
-long sleepsBetween(const Sleeps &before, const Sleeps &after)
+/** A thread that ended in between, or began, was awake for it once. */
+long wakeUpsBetween(const Sleeps &before, const Sleeps &after)
 {
     long count = 0;
     for (const auto &[thread, number] : after)
-        count += number - (before.contains(thread) ? before.at(thread) : 0);
+        count += before.contains(thread) ? number - before.at(thread) : number + 1;
+    for (const auto &[thread, number] : before)
+        count += after.contains(thread) ? 0 : 1;
     return count;
 }
 
@@ -184,20 +196,13 @@ std::string name(pid_t process)
     return std::filesystem::read_symlink("/proc/" + std::to_string(process) + "/exe", error).filename().string();
 }
 
-/** Lets events of the display pass for a while. */
-void rest(Display *display, std::chrono::milliseconds duration)
-{
-    usleep(static_cast<useconds_t>(duration.count() * 1000));
-    XSync(display, True);
-}
-
-/** The frames that a display shows while nobody does anything. */
-long changesWhile(Display *display, std::chrono::seconds duration)
+/** The frames that a display shows for a while. Each is acknowledged, since a display reports no second one before. */
+long changesWhile(Display *display, std::chrono::milliseconds duration)
 {
     long changes = 0;
     const auto end = Clock::now() + duration;
     while (Clock::now() < end) {
-        usleep(100'000);
+        usleep(50'000);
         while (XPending(display)) {
             XEvent event;
             XNextEvent(display, &event);
@@ -210,13 +215,26 @@ long changesWhile(Display *display, std::chrono::seconds duration)
     return changes;
 }
 
-void report(Display *display, pid_t process, double painted, int idleSeconds)
+void reportIdleness(Display *display, const std::vector<pid_t> &family, int seconds)
+{
+    changesWhile(display, settleTime);
+    std::vector<Sleeps> before;
+    for (const pid_t member : family)
+        before.push_back(sleeps(member));
+    const long changes = changesWhile(display, std::chrono::seconds(seconds));
+    std::printf(", \"idle_seconds\": %d, \"idle_frames\": %ld, \"idle_wake_ups\": {", seconds, changes);
+    for (std::size_t i = 0; i < family.size(); ++i)
+        std::printf("%s\"%s\": %ld", i ? ", " : "", name(family[i]).c_str(),
+                    wakeUpsBetween(before[i], sleeps(family[i])));
+    std::printf("}");
+}
+
+void report(Display *display, pid_t process, Painted painted, int idleSeconds)
 {
     std::vector<pid_t> family;
     addFamily(process, family);
-    std::printf("{\"painted\": %.3f, \"processes\": [", painted);
+    std::printf("{\"painted\": %.3f, \"painted_at\": %.6f, \"processes\": [", painted.milliseconds, painted.at);
     const char *separator = "";
-    std::vector<Sleeps> before;
     for (const pid_t member : family) {
         const Footprint print = footprint(member);
         std::printf("%s{\"name\": \"%s\", \"peak\": %.2f, \"pss\": %.2f, \"private\": %.2f, \"faults\": %ld, "
@@ -226,16 +244,8 @@ void report(Display *display, pid_t process, double painted, int idleSeconds)
         separator = ", ";
     }
     std::printf("]");
-    if (idleSeconds > 0) {
-        for (const pid_t member : family)
-            before.push_back(sleeps(member));
-        const long changes = changesWhile(display, std::chrono::seconds(idleSeconds));
-        std::printf(", \"idle_seconds\": %d, \"idle_frames\": %ld, \"idle_wake_ups\": {", idleSeconds, changes);
-        for (std::size_t i = 0; i < family.size(); ++i)
-            std::printf("%s\"%s\": %ld", i ? ", " : "", name(family[i]).c_str(),
-                        sleepsBetween(before[i], sleeps(family[i])));
-        std::printf("}");
-    }
+    if (idleSeconds > 0)
+        reportIdleness(display, family, idleSeconds);
     std::printf("}\n");
 }
 
@@ -267,9 +277,11 @@ int main(int argc, char *argv[])
     if (posix_spawnp(&process, argv[first], nullptr, &attributes, argv + first, environ) != 0)
         return 2;
     const bool isPainted = waitForPicture(display);
-    const double painted = std::chrono::duration<double, std::milli>(Clock::now() - start).count();
+    const Painted painted = {
+        std::chrono::duration<double, std::milli>(Clock::now() - start).count(),
+        std::chrono::duration<double>(std::chrono::system_clock::now().time_since_epoch()).count()};
     if (isPainted) {
-        rest(display, restTime);
+        changesWhile(display, restTime);
         report(display, process, painted, idleSeconds);
     }
     kill(-process, SIGTERM);
