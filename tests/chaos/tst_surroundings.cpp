@@ -139,6 +139,7 @@ private Q_SLOTS:
         QFile secret(m_folder.filePath(QStringLiteral("secret")));
         QVERIFY(secret.open(QIODevice::WriteOnly));
         const int inherited = ::dup(secret.handle());
+        const Surroundings surroundings(Variables{{"A_PASSWORD", "secret"}});
         ChaosHost host;
         host.present();
         QTRY_VERIFY(host.isReady());
@@ -149,6 +150,13 @@ private Q_SLOTS:
         for (const auto &entry : files.entryList(QDir::AllEntries | QDir::System | QDir::NoDotAndDotDot))
             QVERIFY(QFile::symLinkTarget(files.filePath(entry)) != secret.fileName());
         QCOMPARE(QFile::symLinkTarget(files.filePath(QStringLiteral("0"))), QStringLiteral("/dev/null"));
+        QFile environment(QStringLiteral("/proc/%1/environ").arg(service));
+        QVERIFY(environment.open(QIODevice::ReadOnly));
+        const auto variables = environment.readAll();
+        QVERIFY(variables.contains("FAVRIN_DEFAULTS_FILE=") && !variables.contains("A_PASSWORD"));
+        QFile limits(QStringLiteral("/proc/%1/limits").arg(service));
+        QVERIFY(limits.open(QIODevice::ReadOnly));
+        QVERIFY(limits.readAll().simplified().contains("Max core file size 1 1 bytes"));
         ::close(inherited);
     }
 

@@ -79,6 +79,9 @@ private Q_SLOTS:
     void onlyTheServiceIsHeard();
     void colorsThatCannotBeReadAreDropped_data();
     void colorsThatCannotBeReadAreDropped();
+    void numbersOutsideOfTheirRangeAreBroughtIntoIt_data();
+    void numbersOutsideOfTheirRangeAreBroughtIntoIt();
+    void answersToWhatWasCancelledChangeNothing();
     void twoUsesShareOneConnectionThatTheFirstMade();
     void aServiceThatDiesLeavesThePickerLockedAndTheNextUseConnectsAnew();
     void aServiceThatTakesTheNameOverIsAnotherOne();
@@ -231,6 +234,8 @@ void TestEyedropperClient::colorsThatCannotBeReadAreDropped_data()
     QTest::newRow("nothing") << colorOf(sRGB, {});
     QTest::newRow("one too many") << colorOf(sRGB, {0, 0, 0, 0, 1});
     QTest::newRow("many too many") << colorOf(sRGB, QList<double>(100000, 0.5));
+    QTest::newRow("as many as a message holds") << colorOf(sRGB, QList<double>(4'000'000, 0.5));
+    QTest::newRow("a space of a megabyte") << colorOf(QString(1 << 20, u'x'), {0, 0, 0, 1});
     QTest::newRow("unknown space") << colorOf(QStringLiteral("CMYK"), {0, 0, 0, 1});
     QTest::newRow("no space") << colorOf({}, {0, 0, 0, 1});
     QTest::newRow("other arguments") << QVariantList{QStringLiteral("#FF0000")};
@@ -248,6 +253,50 @@ void TestEyedropperClient::colorsThatCannotBeReadAreDropped()
     service.say(selected, color);
     settle(service);
     QCOMPARE(m_host.messages, words("show"));
+}
+
+void TestEyedropperClient::numbersOutsideOfTheirRangeAreBroughtIntoIt_data()
+{
+    QTest::addColumn<double>("component");
+    QTest::addColumn<double>("taken");
+    QTest::newRow("below") << -1.0 << 0.0;
+    QTest::newRow("above") << 2.0 << 1.0;
+    QTest::newRow("far above") << 1e308 << 1.0;
+    QTest::newRow("far below") << -std::numeric_limits<double>::max() << 0.0;
+    QTest::newRow("next to nothing") << std::numeric_limits<double>::denorm_min()
+                                     << std::numeric_limits<double>::denorm_min();
+}
+
+void TestEyedropperClient::numbersOutsideOfTheirRangeAreBroughtIntoIt()
+{
+    QFETCH(double, component);
+    QFETCH(double, taken);
+    ScriptedService service(m_bus->connection());
+    touchDown();
+    QTRY_COMPARE(service.messages, QStringList{begin});
+    service.say(selected, colorOf(sRGB, {component, 0.5, 0.5, component}));
+    QTRY_VERIFY(!m_host.picks.empty());
+    const auto color = model::SomeColor(taken, 0.5, 0.5, taken, model::SomeColor::ColorSpace::sRGB).platformColor();
+    QCOMPARE(m_host.picks.front(), (RecordedHost::Pick{color, std::nullopt, false}));
+}
+
+void TestEyedropperClient::answersToWhatWasCancelledChangeNothing()
+{
+    ScriptedService service(m_bus->connection());
+    touchDown();
+    QTRY_COMPARE(service.messages, QStringList{begin});
+    m_front->pickerDidCancelEyeDropper();
+    QTRY_COMPARE(service.messages.last(), QStringLiteral("cancelShowingEyeDropper"));
+    service.say(dismissed);
+    QTRY_VERIFY(m_front->isInteractionEnabled());
+    // Once more, and late.
+    service.say(dismissed);
+    settle(service);
+    QVERIFY(m_front->isInteractionEnabled());
+    QVERIFY(!state().eyedropperShowing());
+    QVERIFY(m_host.picks.empty());
+    touchDown();
+    QTRY_COMPARE(service.messages.count(begin), 2);
 }
 
 void TestEyedropperClient::twoUsesShareOneConnectionThatTheFirstMade()

@@ -12,15 +12,20 @@
 
 #include <fcntl.h>
 #include <linux/netlink.h>
+#include <linux/perf_event.h>
 #include <pty.h>
+#include <sched.h>
 #include <seccomp.h>
 #include <spawn.h>
 #include <sys/mman.h>
+#include <sys/mount.h>
 #include <sys/ptrace.h>
 #include <sys/resource.h>
 #include <sys/socket.h>
 #include <sys/stat.h>
 #include <sys/syscall.h>
+#include <sys/uio.h>
+#include <sys/un.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -54,6 +59,21 @@ int writing(const fs::path &path, int flags = 0)
 {
     const int file = ::open(path.c_str(), O_WRONLY | O_CLOEXEC | flags, 0600);
     return file < 0 ? errno : ::write(file, "x", 1) == 1 ? 0 : errno;
+}
+
+int binding(const fs::path &path)
+{
+    sockaddr_un address = {};
+    address.sun_family = AF_UNIX;
+    path.string().copy(address.sun_path, sizeof address.sun_path - 1);
+    return errorOf(
+        ::bind(::socket(AF_UNIX, SOCK_STREAM, 0), reinterpret_cast<const sockaddr *>(&address), sizeof address));
+}
+
+/** Of what the kernel shows of the parent to those who may look into it. */
+int readingOfParent(const char *what)
+{
+    return errorOf(::open(("/proc/" + std::to_string(::getppid()) + '/' + what).c_str(), O_RDONLY | O_CLOEXEC));
 }
 
 int runningAThread()
@@ -141,6 +161,10 @@ private Q_SLOTS:
             [this] { return errorOf(::rename((m_outside / "file").c_str(), (m_inside / "file").c_str())); });
         row("link to a file elsewhere", EXDEV,
             [this] { return errorOf(::link((m_outside / "file").c_str(), (m_inside / "link").c_str())); });
+        row("make a socket elsewhere", EACCES, [this] { return binding(m_outside / "socket"); });
+        row("make a pipe elsewhere", EACCES, [this] { return errorOf(::mkfifo((m_outside / "p").c_str(), 0600)); });
+        row("read the parent's memory", EACCES, [] { return readingOfParent("mem"); });
+        row("enter the parent's root", EACCES, [] { return readingOfParent("root/etc"); });
         row("write to a device that was named", 0, [] { return writing("/dev/null"); });
         row("write to another device", EACCES, [] { return writing("/dev/zero"); });
     }
@@ -170,6 +194,16 @@ private Q_SLOTS:
         row("io_uring", EPERM, [] { return errorOf(::syscall(SYS_io_uring_setup, 1, nullptr)); });
         row("user faults", EPERM, [] { return errorOf(::syscall(SYS_userfaultfd, 0)); });
         row("key rings", EPERM, [] { return errorOf(::syscall(SYS_keyctl, 0, -3, 0)); });
+        row("mounting", EPERM, [this] { return errorOf(::mount("none", m_inside.c_str(), "tmpfs", 0, nullptr)); });
+        row("another root", EPERM, [this] { return errorOf(::chroot(m_inside.c_str())); });
+        row("programs for the kernel", EPERM, [] { return errorOf(::syscall(SYS_bpf, 0, nullptr, 0)); });
+        row("the clock", EPERM, [] {
+            timespec now = {};
+            ::clock_gettime(CLOCK_REALTIME, &now);
+            return errorOf(::clock_settime(CLOCK_REALTIME, &now));
+        });
+        row("a file by its number", EPERM, [] { return errorOf(::syscall(SYS_open_by_handle_at, 0, nullptr, 0)); });
+        row("a server", EPERM, [] { return errorOf(::listen(::socket(AF_UNIX, SOCK_STREAM, 0), 1)); });
         row("modes of files", EPERM, [this] { return errorOf(::chmod((m_outside / "file").c_str(), 0666)); });
         row("times of files", EPERM,
             [this] { return errorOf(::utimensat(AT_FDCWD, (m_outside / "file").c_str(), nullptr, 0)); });
@@ -186,6 +220,18 @@ private Q_SLOTS:
         process("a signal to the parent", [] { return errorOf(::kill(::getppid(), SIGCONT)); });
         process("a look into the parent",
                 [] { return errorOf(::ptrace(PTRACE_SEIZE, ::getppid(), nullptr, nullptr)); });
+        process("counting another's steps", [] {
+            perf_event_attr attributes = {};
+            attributes.size = sizeof attributes;
+            return errorOf(::syscall(SYS_perf_event_open, &attributes, ::getppid(), -1, -1, 0));
+        });
+        process("a name space of its own", [] { return errorOf(::unshare(CLONE_NEWUSER)); });
+        process("the parent's memory by a call", [] {
+            char byte = 0;
+            iovec here = {&byte, 1};
+            iovec there = {&byte, 1};
+            return errorOf(::process_vm_readv(::getppid(), &here, 1, &there, 1, 0));
+        });
         process("the parent's descriptors", [] {
             const auto parent = ::syscall(SYS_pidfd_open, ::getppid(), 0);
             return errorOf(::syscall(SYS_pidfd_getfd, parent, 0, 0));
@@ -239,12 +285,27 @@ private Q_SLOTS:
 
     void nothingOutlivesTheParentOrACrash()
     {
+        // As far as it may: the limit before must not be what keeps the dump away.
+        rlimit before = {};
+        QCOMPARE(::getrlimit(RLIMIT_CORE, &before), 0);
+        before.rlim_cur = before.rlim_max;
+        QCOMPARE(::setrlimit(RLIMIT_CORE, &before), 0);
         const int answer = inChild([] {
             leaveNoCoreDump();
             rlimit limit = {};
             return ::getrlimit(RLIMIT_CORE, &limit) == 0 && limit.rlim_max == 1 ? 0 : 1;
         });
         QCOMPARE(answer, 0);
+        const pid_t crashing = ::fork();
+        if (crashing == 0) {
+            ::chdir(m_inside.c_str());
+            leaveNoCoreDump();
+            std::signal(SIGSEGV, SIG_DFL);
+            ::raise(SIGSEGV);
+        }
+        int status = 0;
+        QCOMPARE(::waitpid(crashing, &status, 0), crashing);
+        QVERIFY(WIFSIGNALED(status) && !WCOREDUMP(status));
 
         std::array<int, 2> pipe = {-1, -1};
         QCOMPARE(::pipe(pipe.data()), 0);
