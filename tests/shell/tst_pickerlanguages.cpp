@@ -4,6 +4,7 @@
 #include "platform/strings/localizedstring.h"
 #include "platform/strings/translationtable.h"
 #include "support/pseudolocale.h"
+#include "support/sceneitems.h"
 
 #include <QDir>
 #include <QLocale>
@@ -31,14 +32,6 @@ std::vector<model::SomeColor> colors(int count)
     for (int level = 0; level < count; ++level)
         colors.emplace_back(level / 30.0, 0.5, 0.5, 1.0, model::SomeColor::ColorSpace::sRGB);
     return colors;
-}
-
-QList<QQuickItem *> itemsBelow(const QQuickItem *item)
-{
-    QList<QQuickItem *> items;
-    for (auto *child : item->childItems())
-        items << child << itemsBelow(child);
-    return items;
 }
 
 } // namespace

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "../support/sceneitems.h"
 #include "service/colorpickerstate.h"
 #include "sliders/cpslider.h"
 #include "theme/theme.h"
@@ -12,15 +13,6 @@
 
 #include <algorithm>
 #include <memory>
-
-/** Every item below @p item, those of menus and other guests too, which have other owners. */
-inline QList<QQuickItem *> itemsBelow(const QQuickItem *item)
-{
-    QList<QQuickItem *> items;
-    for (auto *child : item->childItems())
-        items << child << itemsBelow(child);
-    return items;
-}
 
 /**
  * The content of the sliders tab and, below it, the row of the opacity, in a window of 344 × 400 points that is shown
