@@ -90,6 +90,9 @@ void FavoriteColorPickerViewTest::tapPicksTheColorOfTheItem()
     QCOMPARE(strip.state.selectedColor(), std::optional(gray(20)));
     QTRY_VERIFY(strip.cells().cellAt(1)->isSelected());
     QVERIFY(!strip.cells().cellAt(0)->isSelected());
+    // Between the two there is nothing to pick.
+    QTest::mouseClick(&strip.window, Qt::LeftButton, {}, (strip.middle(0) + strip.middle(1)) / 2);
+    QCOMPARE(strip.state.selectedColor(), std::optional(gray(20)));
     // Tapped again, it stays selected.
     QTest::mouseClick(&strip.window, Qt::LeftButton, {}, strip.middle(1));
     QTRY_VERIFY(strip.cells().cellAt(1)->isSelected());

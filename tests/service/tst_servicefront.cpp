@@ -382,7 +382,7 @@ void TestServiceFront::withoutAHostNothingIsSent()
 
 void TestServiceFront::withoutAHostedPickerTheFrontStaysAlive()
 {
-    platform::viewcontrollerregistry::registerClass(hostedPickerClassName, [] { return nullptr; });
+    platform::viewcontrollerregistry::registerClass(hostedPickerClassName, {});
     QTest::ignoreMessage(QtCriticalMsg, "No hosted picker is registered; the picker stays empty");
     m_front->setConfiguration({.hostWindowHeight = 400});
     m_front->setSelectedColor(red.platformColor(), sRGBName);

@@ -238,6 +238,9 @@ void GpuTest::incompleteDescriptionsMakeNothing()
     QVERIFY(m_device->makeRenderPipelineState(pipeline, nullptr));
     pipeline.fragmentFunction = pipeline.vertexFunction;
     QVERIFY(!m_device->makeRenderPipelineState(pipeline, nullptr));
+    pipeline.fragmentFunction = m_device->makeDefaultLibrary()->makeFunction("noShader");
+    std::string error;
+    QVERIFY(!m_device->makeRenderPipelineState(pipeline, &error) && !error.empty());
     pipeline = redPipeline(*m_device);
     pipeline.colorAttachments[0].pixelFormat = PixelFormat::Invalid;
     QVERIFY(!m_device->makeRenderPipelineState(pipeline, nullptr));
