@@ -6,6 +6,8 @@
 #include <QTemporaryDir>
 #include <QTest>
 
+#include <memory>
+
 using namespace favrin::tool;
 
 namespace {
@@ -86,7 +88,7 @@ private Q_SLOTS:
         QTRY_VERIFY(run.isShown());
         const std::array<QPoint, 3> places = {run.swatch(3, 5), run.swatch(3, 8), run.swatch(4, 10)};
         if (isTouch) {
-            auto touch = QTest::touchEvent(&run.window(), const_cast<QPointingDevice *>(m_touchScreen), false);
+            auto touch = QTest::touchEvent(&run.window(), m_touchScreen.get(), false);
             touch.press(0, places[0]).commit();
             QTRY_COMPARE(run.hex(), QStringLiteral("#b51a00"));
             touch.move(0, places[1]).commit();
@@ -147,7 +149,7 @@ private Q_SLOTS:
 
 private:
     QTemporaryDir m_data;
-    const QPointingDevice *m_touchScreen = QTest::createTouchDevice();
+    const std::unique_ptr<QPointingDevice> m_touchScreen{QTest::createTouchDevice()};
 };
 
 QTEST_MAIN(ToolRoadTest)

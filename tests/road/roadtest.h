@@ -4,6 +4,8 @@
 
 #include <QTemporaryDir>
 
+#include <memory>
+
 /** What every road test starts with: stored settings of its own, empty each time, and no picker of the test before. */
 class RoadTest : public QObject
 {
@@ -11,7 +13,7 @@ class RoadTest : public QObject
 
 protected:
     QString defaultsFile() const { return m_data.filePath(QStringLiteral("defaults.sqlite")); }
-    const QPointingDevice *touchScreen() const { return m_touchScreen; }
+    const QPointingDevice *touchScreen() const { return m_touchScreen.get(); }
 
 private Q_SLOTS:
     void initTestCase()
@@ -30,5 +32,5 @@ private Q_SLOTS:
 
 private:
     QTemporaryDir m_data;
-    const QPointingDevice *m_touchScreen = QTest::createTouchDevice();
+    const std::unique_ptr<QPointingDevice> m_touchScreen{QTest::createTouchDevice()};
 };

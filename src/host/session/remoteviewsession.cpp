@@ -167,8 +167,10 @@ void RemoteViewSession::end()
     m_notifier.reset();
     if (m_process->processIdentifier() == 0)
         return;
-    // The process object stays behind to reap what leaves, and to end what does not.
+    // The process object stays behind to reap what leaves, and to end what does not; at the latest it goes with the
+    // app.
     auto *process = std::exchange(m_process, std::make_unique<ServiceProcess>()).release();
+    process->setParent(QCoreApplication::instance());
     process->disconnect(this);
     connect(process, &ServiceProcess::ended, process, &QObject::deleteLater);
     QTimer::singleShot(timeToLeave, process, &ServiceProcess::kill);
