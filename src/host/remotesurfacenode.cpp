@@ -1,5 +1,6 @@
 #include "host/remotesurfacenode.h"
 
+#include "host/paintedtile.h"
 #include "host/session/remotesurface.h"
 
 #include <QQuickWindow>
@@ -7,21 +8,20 @@
 #include <QSGRendererInterface>
 #include <QSGTexture>
 
-#include <algorithm>
 #include <utility>
 
 namespace favrin::host {
 
 namespace {
 
-/** Pixels; small enough that a moved marker repaints little, large enough that a full repaint stays one of few parts.
- */
-constexpr int stripHeight = 64;
+/** Pixels; small enough that a moved marker repaints little, large enough that a full repaint is one of few parts. */
+constexpr int tileHeight = 64;
+constexpr int tilesAcross = 6;
 
-QRect stripRectangle(const QSize &size, int index)
+/** Each pixel of the surface is one of the window. */
+bool isExact(const QQuickWindow &window, const RemoteSurface &surface, const QRectF &target)
 {
-    const int top = index * stripHeight;
-    return {0, top, size.width(), std::min(stripHeight, size.height() - top)};
+    return qFuzzyCompare(target.width() * window.effectiveDevicePixelRatio(), double(surface.size().width()));
 }
 
 } // namespace
@@ -30,74 +30,71 @@ RemoteSurfaceNode::RemoteSurfaceNode(QQuickWindow &window) : m_window(window) {}
 
 RemoteSurfaceNode::~RemoteSurfaceNode() = default;
 
-void RemoteSurfaceNode::clear()
-{
-    for (auto *strip : m_strips) {
-        removeChildNode(strip);
-        delete strip;
-    }
-    m_strips.clear();
-}
-
-void RemoteSurfaceNode::replaceTexture(const RemoteSurface &surface)
-{
-    // The software scene graph paints on this thread before the surface can change again, so it may use the memory
-    // itself; a GPU uploads later, on its own thread.
-    const bool software = m_window.rendererInterface()->graphicsApi() == QSGRendererInterface::Software;
-    const QImage image = software ? surface.image() : surface.image().copy();
-    const auto previous = std::exchange(m_texture, std::unique_ptr<QSGTexture>(m_window.createTextureFromImage(
-                                                       image, QQuickWindow::TextureHasAlphaChannel)));
-    for (auto *strip : m_strips)
-        strip->setTexture(m_texture.get());
-}
-
-void RemoteSurfaceNode::build()
-{
-    for (int index = 0; index * stripHeight < m_size.height(); ++index) {
-        auto *strip = m_window.createImageNode();
-        strip->setOwnsTexture(false);
-        strip->setTexture(m_texture.get());
-        place(*strip, index);
-        // Only now: the software scene graph looks at a node as soon as it is added.
-        appendChildNode(strip);
-        m_strips.push_back(strip);
-    }
-}
-
-void RemoteSurfaceNode::place(QSGImageNode &strip, int index) const
-{
-    const QRect source = stripRectangle(m_size, index);
-    const double pointsPerPixel = m_target.height() / m_size.height();
-    strip.setSourceRect(source);
-    strip.setRect(m_target.x(), m_target.y() + source.y() * pointsPerPixel, m_target.width(),
-                  source.height() * pointsPerPixel);
-    const double pixels = m_target.width() * m_window.effectiveDevicePixelRatio();
-    strip.setFiltering(qFuzzyCompare(pixels, double(m_size.width())) ? QSGTexture::Nearest : QSGTexture::Linear);
-}
-
 void RemoteSurfaceNode::update(const RemoteSurface &surface, const QRectF &target, const QRegion &damage,
                                bool everything)
 {
-    const bool rebuilt = surface.size() != m_size;
-    const bool moved = target != m_target;
+    if (m_window.rendererInterface()->graphicsApi() == QSGRendererInterface::Software)
+        updateTiles(surface, target, damage, everything);
+    else
+        updatePicture(surface, target, everything || !damage.isEmpty());
+    m_size = surface.size();
     m_target = target;
-    if (rebuilt) {
-        clear();
-        m_size = surface.size();
-    }
-    if (rebuilt || everything || !damage.isEmpty())
-        replaceTexture(surface);
-    if (rebuilt) {
-        build();
+}
+
+void RemoteSurfaceNode::updateTiles(const RemoteSurface &surface, const QRectF &target, const QRegion &damage,
+                                    bool everything)
+{
+    // Smoothing ends at the edges of what is drawn, and upright edges show.
+    const int across = isExact(m_window, surface, target) ? tilesAcross : 1;
+    if (std::exchange(m_tilesAcross, across) != across || surface.size() != m_size) {
+        makeTiles(surface, target);
         return;
     }
-    for (int index = 0; index < static_cast<int>(m_strips.size()); ++index) {
-        auto *strip = m_strips[static_cast<std::size_t>(index)];
-        if (moved)
-            place(*strip, index);
-        if (everything || damage.intersects(stripRectangle(m_size, index)))
-            strip->markDirty(DirtyMaterial);
+    const bool isAllNew = everything || target != m_target;
+    for (PaintedTile *tile : m_tiles) {
+        if (isAllNew || damage.intersects(tile->pixels()))
+            tile->show(surface.image(), target);
     }
+}
+
+void RemoteSurfaceNode::makeTiles(const RemoteSurface &surface, const QRectF &target)
+{
+    for (PaintedTile *tile : std::exchange(m_tiles, {})) {
+        removeChildNode(tile);
+        delete tile;
+    }
+    const QRect whole(QPoint(), surface.size());
+    const QSize size((whole.width() + m_tilesAcross - 1) / m_tilesAcross, tileHeight);
+    for (int y = 0; y < whole.height(); y += size.height()) {
+        for (int x = 0; x < whole.width(); x += size.width()) {
+            auto *tile = new PaintedTile(m_window, QRect(QPoint(x, y), size) & whole);
+            tile->show(surface.image(), target);
+            // Only now: the software scene graph looks at a node as soon as it is added.
+            appendChildNode(tile);
+            m_tiles.push_back(tile);
+        }
+    }
+}
+
+void RemoteSurfaceNode::updatePicture(const RemoteSurface &surface, const QRectF &target, bool isChanged)
+{
+    const bool isFirst = !m_picture;
+    if (isFirst) {
+        m_picture = m_window.createImageNode();
+        m_picture->setOwnsTexture(false);
+    }
+    std::unique_ptr<QSGTexture> previous;
+    if (isFirst || isChanged) {
+        // A copy: the texture is uploaded later, on the thread that renders.
+        previous = std::exchange(m_texture, std::unique_ptr<QSGTexture>(m_window.createTextureFromImage(
+                                                surface.image().copy(), QQuickWindow::TextureHasAlphaChannel)));
+        m_picture->setTexture(m_texture.get());
+    }
+    m_picture->setFiltering(isExact(m_window, surface, target) ? QSGTexture::Nearest : QSGTexture::Linear);
+    m_picture->setSourceRect(QRectF(QPointF(), surface.size()));
+    m_picture->setRect(target);
+    if (isFirst)
+        appendChildNode(m_picture);
 }
 
 } // namespace favrin::host
