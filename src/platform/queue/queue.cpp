@@ -64,20 +64,18 @@ private:
     std::deque<Work> m_work;
 };
 
+// Whoever runs work finds the queue by these, which order its making before its use.
+void runNextOnMainThread();
+void runNextInBackground();
+
 /** Lives on the main thread. Of the events it looks only at their number, since they are made on other threads. */
 class MainThread : public QObject
 {
 public:
-    explicit MainThread(WaitingWork &waiting) : m_waiting(waiting)
-    {
-        moveToThread(QCoreApplication::instance()->thread());
-    }
+    MainThread() { moveToThread(QCoreApplication::instance()->thread()); }
 
 protected:
-    void customEvent(QEvent *) override { m_waiting.runNext(); }
-
-private:
-    WaitingWork &m_waiting;
+    void customEvent(QEvent *) override { runNextOnMainThread(); }
 };
 
 class MainQueue : public Queue
@@ -97,7 +95,7 @@ public:
     {
         const std::lock_guard guard(m_mutex);
         m_phase = Phase::Running;
-        m_mainThread = std::make_unique<MainThread>(m_waiting);
+        m_mainThread = std::make_unique<MainThread>();
         for (std::size_t waiting = m_waiting.size(); waiting > 0; --waiting)
             post();
     }
@@ -111,6 +109,8 @@ public:
         }
         m_waiting.drop();
     }
+
+    void runNext() { m_waiting.runNext(); }
 
 private:
     enum class Phase { BeforeApplication, Running, AfterApplication };
@@ -134,8 +134,10 @@ public:
         if (!pool)
             return;
         m_waiting.add(std::move(work));
-        pool->start([this] { m_waiting.runNext(); });
+        pool->start([] { runNextInBackground(); });
     }
+
+    void runNext() { m_waiting.runNext(); }
 
 private:
     WaitingWork m_waiting;
@@ -146,6 +148,22 @@ MainQueue &theMainQueue()
 {
     static auto *const queue = new MainQueue;
     return *queue;
+}
+
+BackgroundQueue &theBackgroundQueue()
+{
+    static auto *const queue = new BackgroundQueue;
+    return *queue;
+}
+
+void runNextOnMainThread()
+{
+    theMainQueue().runNext();
+}
+
+void runNextInBackground()
+{
+    theBackgroundQueue().runNext();
 }
 
 void watchApplication()
@@ -166,8 +184,7 @@ Queue &mainQueue()
 
 Queue &backgroundQueue()
 {
-    static auto *const queue = new BackgroundQueue;
-    return *queue;
+    return theBackgroundQueue();
 }
 
 } // namespace favrin::platform
