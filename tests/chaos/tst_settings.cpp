@@ -1,5 +1,7 @@
 #include "chaoshost.h"
 
+#include "../eyedropper/privatebus.h"
+
 #include <fcntl.h>
 #include <sys/mount.h>
 #include <sys/stat.h>
@@ -210,7 +212,116 @@ private Q_SLOTS:
             QVERIFY(host->terminated.isEmpty());
     }
 
+    void faultsInAnyOrderLoseNothing()
+    {
+        constexpr unsigned seed = 20261123;
+        std::mt19937 random(seed);
+        const SmallDisk disk(m_settings.folder());
+        PrivateBus bus;
+        QVERIFY(bus.start());
+        const auto address = qgetenv("DBUS_SESSION_BUS_ADDRESS");
+        qputenv("DBUS_SESSION_BUS_ADDRESS", bus.address().toUtf8());
+        const auto restore = qScopeGuard([&] { qputenv("DBUS_SESSION_BUS_ADDRESS", address); });
+        ChaosHost host;
+        int added = 0;
+        const int rounds = chaosRounds(16);
+        for (int round = 0; round < rounds && !QTest::currentTestFailed(); ++round) {
+            if (round == rounds / 2)
+                bus.stop();
+            if (added > 1) {
+                // The first page has room for three.
+                dismiss(host);
+                QTRY_VERIFY(servicesOf(getpid()).empty());
+                m_settings.clear();
+                added = 0;
+            }
+            const auto whom = static_cast<ToThePicker>(random() % 5);
+            const auto what = static_cast<ToTheFile>(random() % 5);
+            happen(host, whom, std::chrono::microseconds(random() % 30'000));
+            happen(host, what, disk, added);
+            // Whatever it was: the next favorite is kept, and all before it.
+            host.addFavorite(gray(100 + added), 5 + added);
+            ++added;
+            QTRY_VERIFY2(m_settings.favorites() == withAdded(added),
+                         qPrintable(QStringLiteral("round %1 of seed %2, %3 and %4: %5")
+                                        .arg(round)
+                                        .arg(seed)
+                                        .arg(int(whom))
+                                        .arg(int(what))
+                                        .arg(m_settings.favorites().join(u' '))));
+        }
+        host.picker.dismiss();
+    }
+
 private:
+    enum class ToThePicker { Nothing, Kill, KillInADrag, Standstill, Dismissal };
+    enum class ToTheFile { Nothing, Garbage, Folder, Loss, FullDisk };
+
+    static void dismiss(ChaosHost &host)
+    {
+        host.finished.clear();
+        host.picker.dismiss();
+        QTRY_VERIFY(host.finished.size() == 1 || !host.picker.isPresented());
+    }
+
+    /** Afterwards there is a picker, be it the same. */
+    static void happen(ChaosHost &host, ToThePicker fault, std::chrono::microseconds when)
+    {
+        if (host.isReady() && fault == ToThePicker::Dismissal)
+            dismiss(host);
+        else if (host.isReady() && fault != ToThePicker::Nothing)
+            sendSignal(host, fault, when);
+        if (!host.picker.isPresented())
+            host.present();
+        QTRY_VERIFY(host.isReady());
+    }
+
+    static void sendSignal(ChaosHost &host, ToThePicker fault, std::chrono::microseconds when)
+    {
+        const pid_t service = servicesOf(getpid()).at(0);
+        const bool ends = fault != ToThePicker::Standstill;
+        if (fault == ToThePicker::KillInADrag)
+            QTest::mousePress(&host.window, Qt::LeftButton, {}, host.swatch(0, 0));
+        if (!ends)
+            kill(service, SIGSTOP);
+        {
+            const SignalSoon soon(service, ends ? SIGKILL : SIGCONT, when);
+            for (int step = 0; fault == ToThePicker::KillInADrag && step < 20; ++step) {
+                host.dragStep(step);
+                QCoreApplication::processEvents();
+            }
+        }
+        if (ends)
+            QTRY_VERIFY(!host.picker.isPresented());
+        QTest::mouseRelease(&host.window, Qt::LeftButton, {}, QPoint(1, 1));
+    }
+
+    void happen(ChaosHost &host, ToTheFile fault, const SmallDisk &disk, int &added)
+    {
+        switch (fault) {
+        case ToTheFile::Nothing:
+            return;
+        case ToTheFile::Garbage:
+        case ToTheFile::Folder:
+        case ToTheFile::Loss:
+            m_settings.clear();
+            if (fault != ToTheFile::Loss)
+                place(fault == ToTheFile::Folder ? QStringLiteral("folder") : QStringLiteral("garbage"));
+            return;
+        case ToTheFile::FullDisk:
+            if (!disk.isMounted())
+                return;
+            disk.fill(0);
+            host.addFavorite(gray(100 + added), 5 + added);
+            ++added;
+            // Taken in when it answers to what came after.
+            host.picks.clear();
+            host.click(host.swatch(1, 1));
+            QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+            disk.makeRoom();
+        }
+    }
+
     /** Shows a picker and keeps a first favorite. */
     static void addOne(ChaosHost &host)
     {

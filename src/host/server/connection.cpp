@@ -10,6 +10,7 @@
 #include <utility>
 
 #include <linux/sockios.h>
+#include <poll.h>
 #include <sys/ioctl.h>
 #include <sys/socket.h>
 #include <time.h>
@@ -238,10 +239,10 @@ void Connection::fail(CloseReason reason, std::string detail)
 // libwayland ends a connection over a message that it cannot read without posting an error.
 CloseReason Connection::reasonOfSilentEnd() const
 {
-    char byte = 0;
-    const ssize_t got = ::recv(wl_client_get_fd(m_client), &byte, 1, MSG_PEEK | MSG_DONTWAIT);
-    const bool isOpen = got > 0 || (got < 0 && errno == EAGAIN);
-    return isOpen ? CloseReason::ProtocolError : CloseReason::ServiceGone;
+    // Not whether there is something left to read: of a service that dies nothing more is read.
+    pollfd other = {wl_client_get_fd(m_client), POLLRDHUP, 0};
+    const bool hasLeft = ::poll(&other, 1, 0) > 0;
+    return hasLeft ? CloseReason::ServiceGone : CloseReason::ProtocolError;
 }
 
 int Connection::unreadBytes() const

@@ -234,6 +234,24 @@ private Q_SLOTS:
         ::close(descriptor);
     }
 
+    void aServiceThatDiesBeforeItIsReadHasBrokenNoRule()
+    {
+        RecordingDelegate delegate;
+        RemoteViewServer server(delegate);
+        const int descriptor = server.openConnection();
+        Words all;
+        for (std::uint32_t id = 2; id < 1000; ++id) {
+            const auto words = request(1, 0, 12, {id});
+            all.insert(all.end(), words.begin(), words.end());
+        }
+        QCOMPARE(::write(descriptor, all.data(), all.size() * 4), ssize_t(all.size() * 4));
+        ::close(descriptor);
+        for (int i = 0; i < 8; ++i)
+            server.dispatch();
+        QCOMPARE(delegate.closes.size(), std::size_t(1));
+        QVERIFY(delegate.closes[0].reason == CloseReason::ServiceGone);
+    }
+
     void filesThatNoRequestAsksForAreCounted()
     {
         RecordingDelegate delegate;
