@@ -6,8 +6,11 @@
 #include <QMouseEvent>
 #include <QPainter>
 #include <QPainterPath>
+#include <QQuickWindow>
+#include <QSGRectangleNode>
 #include <QWheelEvent>
 
+#include <algorithm>
 #include <array>
 #include <cmath>
 
@@ -77,10 +80,42 @@ void paintShadow(QPainter &painter, const QRectF &panel)
 
 } // namespace
 
-PresentationPanel::PresentationPanel(QQuickItem *parent) : QQuickPaintedItem(parent)
+/**
+ * What of the panel has neither corners nor edges, as a rectangle that the scene graph knows to be opaque: what lies
+ * below it, panel, scrim and the app's own picture, is then not painted again with every step of a drag.
+ */
+class PresentationPanel::Middle : public QQuickItem
+{
+public:
+    explicit Middle(QQuickItem *parent) : QQuickItem(parent) { setFlag(ItemHasContents); }
+
+    void setColor(const QColor &color)
+    {
+        m_color = color;
+        update();
+    }
+
+protected:
+    QSGNode *updatePaintNode(QSGNode *oldNode, UpdatePaintNodeData *) override
+    {
+        auto *node = oldNode ? static_cast<QSGRectangleNode *>(oldNode) : window()->createRectangleNode();
+        node->setRect(boundingRect());
+        node->setColor(m_color);
+        return node;
+    }
+
+private:
+    QColor m_color = panelColor(false);
+};
+
+PresentationPanel::PresentationPanel(QQuickItem *parent) : QQuickPaintedItem(parent), m_middle(new Middle(this))
 {
     setAntialiasing(true);
     setAcceptedMouseButtons(Qt::AllButtons);
+    // While the panel fades in, two layers of it would be seen as such.
+    const auto showMiddle = [this] { m_middle->setVisible(opacity() == 1.0); };
+    connect(this, &QQuickItem::opacityChanged, this, showMiddle);
+    showMiddle();
 }
 
 void PresentationPanel::setLayout(const PresentationLayout &layout)
@@ -89,6 +124,11 @@ void PresentationPanel::setLayout(const PresentationLayout &layout)
     const QRectF place = layout.panel.adjusted(-surround, -surround, surround, surround);
     setPosition(place.topLeft());
     setSize(place.size());
+    // The hairline around the panel reaches half a point into it.
+    const QRectF middle =
+        contentRectangle().adjusted(1, std::max(layout.topRadius, 1.0), -1, -std::max(layout.bottomRadius, 1.0));
+    m_middle->setPosition(middle.topLeft());
+    m_middle->setSize(middle.size().expandedTo(QSizeF(0, 0)));
     update();
 }
 
@@ -97,6 +137,7 @@ void PresentationPanel::setAppearance(bool dark)
     if (m_dark == dark)
         return;
     m_dark = dark;
+    m_middle->setColor(panelColor(dark));
     update();
 }
 

@@ -29,8 +29,11 @@ protected:
     void wheelEvent(QWheelEvent *event) override;
 
 private:
+    class Middle;
+
     QPainterPath outline() const;
 
+    Middle *m_middle;
     PresentationLayout m_layout;
     bool m_dark = false;
 };
