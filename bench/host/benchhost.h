@@ -11,6 +11,7 @@
 #include <QMouseEvent>
 #include <QQuickItem>
 #include <QQuickWindow>
+#include <QTemporaryDir>
 #include <QTimer>
 
 #include <algorithm>
@@ -43,6 +44,22 @@ struct Samples
                 {QStringLiteral("max"), values.back()},
                 {QStringLiteral("p99"), at(0.99)}};
     }
+};
+
+/** What a benchmark needs before there is an application: settings of its own, and drawing by the processor. */
+class Surroundings
+{
+public:
+    Surroundings()
+    {
+        qputenv("FAVRIN_DEFAULTS_FILE", QFile::encodeName(m_data.filePath(QStringLiteral("defaults.sqlite"))));
+        if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
+            qputenv("QT_QPA_PLATFORM", "offscreen");
+        QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
+    }
+
+private:
+    const QTemporaryDir m_data;
 };
 
 inline bool waitFor(const std::function<bool()> &condition)

@@ -9,7 +9,6 @@
 #include <QDir>
 #include <QJsonArray>
 #include <QJsonDocument>
-#include <QTemporaryDir>
 
 #include <array>
 #include <cstdlib>
@@ -150,11 +149,7 @@ bool manySteps(BenchHost &host, int count, QJsonArray &points)
 
 int main(int argc, char *argv[])
 {
-    const QTemporaryDir data;
-    qputenv("FAVRIN_DEFAULTS_FILE", QFile::encodeName(data.path() + QStringLiteral("/defaults.sqlite")));
-    if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
-        qputenv("QT_QPA_PLATFORM", "offscreen");
-    QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
+    const Surroundings surroundings;
     QGuiApplication application(argc, argv);
     const auto argument = [&](int place, int usual) { return argc > place ? std::atoi(argv[place]) : usual; };
     const int rounds = std::max(1, argument(1, 5));

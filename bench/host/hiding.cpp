@@ -6,7 +6,6 @@
 #include "host/benchhost.h"
 
 #include <QJsonDocument>
-#include <QTemporaryDir>
 #include <QTemporaryFile>
 
 #include <array>
@@ -114,10 +113,8 @@ bool measure(const Way &way, BenchHost &host, FrameRecord &record, QJsonObject &
 
 int main(int argc, char *argv[])
 {
-    const QTemporaryDir data;
-    qputenv("FAVRIN_DEFAULTS_FILE", QFile::encodeName(data.path() + QStringLiteral("/defaults.sqlite")));
     qputenv("QT_QPA_PLATFORM", "xcb");
-    QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
+    const Surroundings surroundings;
     FrameRecord record;
     QGuiApplication application(argc, argv);
     BenchHost host;

@@ -7,7 +7,6 @@
 #include "host/benchhost.h"
 
 #include <QJsonDocument>
-#include <QTemporaryDir>
 
 #include <array>
 
@@ -44,11 +43,7 @@ struct Drags
 
 int main(int argc, char *argv[])
 {
-    const QTemporaryDir data;
-    qputenv("FAVRIN_DEFAULTS_FILE", QFile::encodeName(data.path() + QStringLiteral("/defaults.sqlite")));
-    if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
-        qputenv("QT_QPA_PLATFORM", "offscreen");
-    QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
+    const Surroundings surroundings;
     QGuiApplication application(argc, argv);
     const int rounds = argc > 1 ? std::max(1, atoi(argv[1])) : 15;
     // All parts, unless some are named.
