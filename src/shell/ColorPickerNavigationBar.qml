@@ -60,6 +60,6 @@ Item {
         opacity: enabled ? 1 : 0
         enabled: !bar.colorPickerState.isPopover && !bar.colorPickerState.isEmbedded
         Accessible.ignored: !enabled
-        onClicked: bar.colorPickerState.performClose()
+        onTriggered: bar.colorPickerState.performClose()
     }
 }

@@ -1,7 +1,6 @@
 pragma ComponentBehavior: Bound
 
 import QtQuick
-import QtQuick.Templates as T
 import Favrin.Service
 import Favrin.Shell
 import Favrin.Theme
@@ -57,26 +56,27 @@ Item {
     Repeater {
         model: segments.titles
 
-        T.TabButton {
+        MouseArea {
             id: segment
 
             required property int index
             required property string modelData
 
+            readonly property bool checked: index === segments.current
+
             x: picker.segmentX(index)
             width: picker.segmentWidth
             height: picker.height
             containmentMask: TouchMask { face: segment }
-            checked: index === segments.current
-            focusPolicy: Qt.NoFocus
-            text: modelData
+            Accessible.role: Accessible.PageTab
             Accessible.name: modelData
             Accessible.checkable: true
             Accessible.checked: checked
-            Accessible.onPressAction: segment.clicked()
+            Accessible.onPressAction: segments.current = index
             onClicked: segments.current = index
 
-            contentItem: Text {
+            Text {
+                anchors.fill: parent
                 text: segment.modelData
                 textFormat: Text.PlainText
                 elide: Text.ElideRight
@@ -87,7 +87,7 @@ Item {
                 verticalAlignment: Text.AlignVCenter
                 font: Theme.subheadlineFont
                 color: Theme.label
-                opacity: segment.pressed && !segment.checked ? 0.5 : 1
+                opacity: segment.containsPress && !segment.checked ? 0.5 : 1
                 Accessible.ignored: true
             }
         }

@@ -28,7 +28,8 @@ MouseArea {
 
     implicitWidth: symbolSize
     implicitHeight: symbolSize
-    activeFocusOnTab: true
+    // That a pointer cannot reach it is all that a disabled area says by itself.
+    activeFocusOnTab: enabled
     // The finger is the eyedropper's from here on, wherever it goes.
     preventStealing: true
     hoverEnabled: true

@@ -1,30 +1,48 @@
 import QtQuick
-import QtQuick.Templates as T
 import Favrin.Theme
 
 /* The round close button. Its touch area is larger than its face. */
-T.AbstractButton {
+MouseArea {
     id: button
 
     /* What the button is called. */
     required property string label
 
     readonly property real diameter: Math.round(Theme.barSymbolSize * 30 / 17)
+    readonly property bool isPressed: containsPress || spaceIsDown
+    property bool spaceIsDown: false
+
+    /* The user wants what the button does. */
+    signal triggered()
 
     implicitWidth: diameter
     implicitHeight: diameter
-    focusPolicy: Qt.StrongFocus
+    // That a pointer cannot reach it is all that a disabled area says by itself.
+    activeFocusOnTab: enabled
     hoverEnabled: true
     containmentMask: TouchMask { face: button }
 
+    onClicked: triggered()
+    onActiveFocusChanged: spaceIsDown = false
+    Keys.onReturnPressed: triggered()
+    Keys.onEnterPressed: triggered()
+    Keys.onSpacePressed: (event) => spaceIsDown = spaceIsDown || !event.isAutoRepeat
+    Keys.onReleased: (event) => {
+        event.accepted = event.key === Qt.Key_Space && spaceIsDown && !event.isAutoRepeat;
+        if (!event.accepted)
+            return;
+        spaceIsDown = false;
+        triggered();
+    }
+
     Accessible.role: Accessible.Button
     Accessible.name: label
-    Accessible.onPressAction: button.clicked()
-    Keys.onReturnPressed: button.clicked()
-    Keys.onEnterPressed: button.clicked()
+    Accessible.focusable: true
+    Accessible.onPressAction: triggered()
 
-    background: Item {
-        opacity: button.pressed ? 0.5 : 1
+    Item {
+        anchors.fill: parent
+        opacity: button.isPressed ? 0.5 : 1
 
         Symbol {
             anchors.fill: parent
@@ -36,7 +54,7 @@ T.AbstractButton {
             anchors.fill: parent
             kind: Symbol.Disc
             color: Theme.fill
-            visible: button.hovered && !button.pressed
+            visible: button.containsMouse && !button.isPressed
         }
 
         Symbol {
@@ -50,6 +68,6 @@ T.AbstractButton {
 
     FocusRing {
         parentRadius: button.diameter / 2
-        visible: button.visualFocus
+        visible: button.activeFocus
     }
 }

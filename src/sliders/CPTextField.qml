@@ -32,7 +32,7 @@ FieldBackground {
         selectByMouse: true
         activeFocusOnTab: true
         font.family: Theme.bodyFont.family
-        font.pixelSize: Math.floor(metrics.font.pixelSize * Math.min(width / metrics.advanceWidth, 1))
+        font.pixelSize: Math.floor(metrics.font.pixelSize * (width > 0 ? Math.min(width / metrics.advanceWidth, 1) : 1))
         font.weight: Font.Medium
         color: field.colorPickerState.hasSelectedColor ? Theme.label : Theme.tertiaryLabel
         selectionColor: Theme.tint

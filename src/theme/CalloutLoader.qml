@@ -1,5 +1,4 @@
 import QtQuick
-import Favrin.Theme
 
 /* A CalloutMenu that is made when it is wanted first: menus are dear, and most users never open this one. */
 Loader {
@@ -11,25 +10,13 @@ Loader {
 
     signal triggered
     signal closed
+    /* For the menu. */
+    signal openRequested(target: Item, cell: rect)
 
     function openAt(target: Item, cell: rect) {
+        // By its file: the mere name of its type would load it, and the templates below it, with the picker.
         if (status === Loader.Null)
-            setSource("CalloutMenu.qml", {
-                "command": Qt.binding(() => loader.command),
-                "isDestructive": Qt.binding(() => loader.isDestructive)
-            });
-        (item as CalloutMenu).openAt(target, cell);
-    }
-
-    Connections {
-        target: loader.item as CalloutMenu
-
-        function onTriggered() {
-            loader.triggered();
-        }
-
-        function onClosed() {
-            loader.closed();
-        }
+            setSource("CalloutMenu.qml", { "loader": loader });
+        openRequested(target, cell);
     }
 }

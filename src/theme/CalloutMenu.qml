@@ -6,12 +6,8 @@ import Favrin.Theme
 T.Menu {
     id: menu
 
-    /* What the command is called. */
-    required property string command
-    /* Whether something is lost by it. */
-    property bool isDestructive: false
-
-    signal triggered
+    /* Says what the command is, and hears of it. */
+    required property CalloutLoader loader
 
     readonly property real rowHeight: Math.max(40, Theme.bodyFont.pixelSize * 2)
     readonly property real gap: 6
@@ -35,6 +31,15 @@ T.Menu {
     implicitHeight: rowHeight + bubble.arrowHeight
     bottomPadding: bubble.arrowHeight
     onOpened: currentIndex = 0
+    onClosed: loader.closed()
+
+    Connections {
+        target: menu.loader
+
+        function onOpenRequested(target: Item, cell: rect) {
+            menu.openAt(target, cell);
+        }
+    }
 
     contentItem: ListView {
         interactive: false
@@ -47,11 +52,11 @@ T.Menu {
     T.MenuItem {
         id: item
 
-        text: menu.command
+        text: menu.loader.command
         implicitWidth: label.implicitWidth + 40
         implicitHeight: menu.rowHeight
         hoverEnabled: true
-        onTriggered: menu.triggered()
+        onTriggered: menu.loader.triggered()
 
         Accessible.role: Accessible.MenuItem
         Accessible.name: text
@@ -64,7 +69,7 @@ T.Menu {
             text: item.text
             textFormat: Text.PlainText
             font: Theme.bodyFont
-            color: menu.isDestructive ? Theme.systemRed : Theme.label
+            color: menu.loader.isDestructive ? Theme.systemRed : Theme.label
         }
 
         background: Item {

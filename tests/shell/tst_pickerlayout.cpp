@@ -139,7 +139,8 @@ void PickerLayoutTest::titleStaysWhereButtonsAreHidden()
     QVERIFY(picker.isReady());
     const auto title = [&] { return PickerWindow::inWindow(picker.item(QStringLiteral("Colors"))); };
     const QRectF before = title();
-    const QRectF eyedropper = PickerWindow::inWindow(picker.item(QStringLiteral("Eyedropper_Accessibility")));
+    const QQuickItem *eyedropperButton = picker.item(QStringLiteral("Eyedropper_Accessibility"));
+    const QRectF eyedropper = PickerWindow::inWindow(eyedropperButton);
     const QQuickItem *closeButton = picker.item(QStringLiteral("Close"));
     const QRectF close = PickerWindow::inWindow(closeButton);
     QCOMPARE(eyedropper.left(), 16.0);
@@ -155,6 +156,7 @@ void PickerLayoutTest::titleStaysWhereButtonsAreHidden()
         QVERIFY(!picker.state.eyedropperShowing());
         QCOMPARE(picker.closed, 0);
         QVERIFY(!closeButton->hasActiveFocus() && closeButton->opacity() == 0.0);
+        QVERIFY(!closeButton->activeFocusOnTab() && !eyedropperButton->activeFocusOnTab());
         hides->set(false);
     }
 }
