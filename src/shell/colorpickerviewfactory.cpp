@@ -18,9 +18,19 @@ QQmlEngine &withModules(QQmlEngine &engine)
 
 } // namespace
 
-ColorPickerViewFactory::ColorPickerViewFactory(QQmlEngine &engine)
-    : m_component(&withModules(engine), QUrl(QStringLiteral("qrc:/qt/qml/Favrin/Shell/ColorPickerView.qml")))
+ColorPickerViewFactory::ColorPickerViewFactory(QQmlEngine &engine, Loading loading)
+    : m_component(&withModules(engine), QUrl(QStringLiteral("qrc:/qt/qml/Favrin/Shell/ColorPickerView.qml")),
+                  loading == Loading::Beside ? QQmlComponent::Asynchronous : QQmlComponent::PreferSynchronous)
 {
+}
+
+void ColorPickerViewFactory::whenLoaded(std::function<void()> loaded)
+{
+    if (!m_component.isLoading())
+        loaded();
+    else
+        QObject::connect(&m_component, &QQmlComponent::statusChanged, &m_component, std::move(loaded),
+                         Qt::SingleShotConnection);
 }
 
 std::unique_ptr<QQuickItem> ColorPickerViewFactory::create(service::ColorPickerState &state)

@@ -2,6 +2,7 @@
 
 #include <QQmlComponent>
 
+#include <functional>
 #include <memory>
 
 class QQmlEngine;
@@ -20,11 +21,21 @@ namespace favrin::shell {
 class ColorPickerViewFactory
 {
 public:
-    explicit ColorPickerViewFactory(QQmlEngine &engine);
+    enum class Loading {
+        /** When the factory is made, it is over. */
+        AtOnce,
+        /** Beside the main thread, whose event loop has to run meanwhile. */
+        Beside,
+    };
+
+    explicit ColorPickerViewFactory(QQmlEngine &engine, Loading loading = Loading::AtOnce);
+
+    /** Calls @p loaded once, when loading is over, be it with an error; at once where it is over already. */
+    void whenLoaded(std::function<void()> loaded);
 
     /**
-     * A root view of @p state, which must outlive it. Its implicit size is the size of its content. Null, with a
-     * warning logged, when the view cannot be made.
+     * To be called when the view is loaded. A root view of @p state, which must outlive it. Its implicit size is the
+     * size of its content. Null, with a warning logged, when the view cannot be made.
      */
     std::unique_ptr<QQuickItem> create(service::ColorPickerState &state);
 

@@ -12,6 +12,19 @@ namespace favrin::theme {
 using service::ColorScheme;
 using service::DisplayColor;
 
+namespace {
+
+QFont fontOf(TextStyle style, TextSizeCategory category)
+{
+    QFont font = QGuiApplication::font();
+    font.setPixelSize(textSize(style, category, TextSizeCategory::ExtraExtraExtraLarge));
+    if (style == TextStyle::Headline)
+        font.setWeight(QFont::DemiBold);
+    return font;
+}
+
+} // namespace
+
 Theme::Theme()
 {
     updateColors();
@@ -74,11 +87,7 @@ void Theme::setReduceMotion(bool reduce)
 
 QFont Theme::font(TextStyle style) const
 {
-    QFont font = QGuiApplication::font();
-    font.setPixelSize(textSize(style, m_textSizeCategory, TextSizeCategory::ExtraExtraExtraLarge));
-    if (style == TextStyle::Headline)
-        font.setWeight(QFont::DemiBold);
-    return font;
+    return fontOf(style, m_textSizeCategory);
 }
 
 QFont Theme::headlineFont() const
@@ -99,6 +108,16 @@ QFont Theme::subheadlineFont() const
 QFont Theme::footnoteFont() const
 {
     return font(TextStyle::Footnote);
+}
+
+QList<QFont> Theme::usualFonts()
+{
+    constexpr auto size = TextSizeCategory::Large;
+    QFont field = fontOf(TextStyle::Body, size);
+    field.setWeight(QFont::Medium);
+    QFont caption = fontOf(TextStyle::Footnote, size);
+    caption.setWeight(QFont::DemiBold);
+    return {fontOf(TextStyle::Subheadline, size), fontOf(TextStyle::Headline, size), field, caption};
 }
 
 int Theme::barSymbolSize() const

@@ -78,6 +78,8 @@ public:
 
     /** Semibold body text. This and the other fonts grow up to the extra-extra-extra-large category. */
     QFont headlineFont() const;
+    /** What every picker shows at the usual text size, the tabs' first. Needs no instance. */
+    static QList<QFont> usualFonts();
     QFont bodyFont() const;
     QFont subheadlineFont() const;
     QFont footnoteFont() const;

@@ -11,6 +11,7 @@ class ColorPickerViewTest : public QObject
 
 private Q_SLOTS:
     void cleanup() { theme::Theme::instance().setLayoutDirection(Qt::LeftToRight); }
+    void viewsAreLoadedBesideTheMainThread();
     void everyWayOfClosingCloses_data();
     void everyWayOfClosingCloses();
     void longTitleStaysBetweenTheButtons();
@@ -25,6 +26,20 @@ private Q_SLOTS:
     void arrowsFollowTheDirection();
     void selectingAnotherTabEndsADrag();
 };
+
+void ColorPickerViewTest::viewsAreLoadedBesideTheMainThread()
+{
+    QQmlEngine engine;
+    shell::ColorPickerViewFactory factory(engine, shell::ColorPickerViewFactory::Loading::Beside);
+    int loaded = 0;
+    factory.whenLoaded([&loaded] { ++loaded; });
+    QCOMPARE(loaded, 0);
+    QTRY_COMPARE(loaded, 1);
+    service::ColorPickerState state({});
+    QVERIFY(factory.create(state));
+    factory.whenLoaded([&loaded] { ++loaded; });
+    QCOMPARE(loaded, 2);
+}
 
 void ColorPickerViewTest::everyWayOfClosingCloses_data()
 {

@@ -2,15 +2,19 @@
 #include "apps/service/serviceconfinement.h"
 #include "service/fvcolorpickerserviceviewcontroller.h"
 #include "shell/colorpickerviewfactory.h"
+#include "theme/theme.h"
 
 #include <QFontMetricsF>
 #include <QGuiApplication>
 #include <QQmlEngine>
 #include <QQuickItem>
 #include <QQuickWindow>
+#include <QTimer>
 
 #include <cstdio>
 #include <thread>
+
+using favrin::theme::Theme;
 
 namespace {
 
@@ -39,10 +43,26 @@ void dropFarewell(QtMsgType type, const QMessageLogContext &context, const QStri
         previousMessageHandler(type, context, message);
 }
 
-/** Looks the fonts up beside the main thread, which has other things to do before its first text. */
+/** One after the other, so that nothing else has to wait for all of them. */
+void prepareFonts(QList<QFont> fonts)
+{
+    if (fonts.isEmpty())
+        return;
+    QFontMetricsF(fonts.takeLast()).height();
+    QTimer::singleShot(0, qGuiApp, [fonts] { prepareFonts(fonts); });
+}
+
+/**
+ * Looks the fonts up beside the main thread. That makes those of the picker when it can, since each thread has its own;
+ * most likely it is waiting for the views then.
+ */
 std::jthread fontLookUp()
 {
-    return std::jthread([] { QFontMetricsF(QFont()).height(); });
+    return std::jthread([] {
+        QFontMetricsF(QFont()).height();
+        QMetaObject::invokeMethod(
+            qGuiApp, [] { prepareFonts(Theme::usualFonts()); }, Qt::QueuedConnection);
+    });
 }
 
 } // namespace
@@ -63,19 +83,22 @@ int main(int argc, char *argv[])
     QGuiApplication application(argc, argv);
     QGuiApplication::setApplicationName(QStringLiteral("favrin-color-picker-service"));
     QGuiApplication::setDesktopFileName(QStringLiteral("favrin-color-picker"));
+    // Items start with this font until they have heard of their own: so it should be one that is needed anyhow.
+    QGuiApplication::setFont(Theme::usualFonts().first());
     const std::jthread fonts = fontLookUp();
     // The host shows its own pointer; loading a theme of pointers here would cost the first touch of a drag 20 ms.
     QGuiApplication::setOverrideCursor(Qt::BlankCursor);
 
     QQmlEngine engine;
-    favrin::shell::ColorPickerViewFactory views(engine);
+    favrin::shell::ColorPickerViewFactory views(engine, favrin::shell::ColorPickerViewFactory::Loading::Beside);
     favrin::service::FVColorPickerServiceViewController::registerClass(
         [&views](favrin::service::ColorPickerState *state) { return views.create(*state); });
     auto *display = favrin::remote::client::qtWaylandDisplay();
     if (!display)
         return noHost;
     favrin::apps::PickerService service(display);
-    if (!service.connectToHost())
-        return noHost;
+    QObject::connect(&service, &favrin::apps::PickerService::hostIsMissing, &application,
+                     [] { QCoreApplication::exit(noHost); });
+    views.whenLoaded([&service] { service.viewsDidLoad(); });
     return QGuiApplication::exec();
 }

@@ -42,12 +42,6 @@ PickerService::PickerService(wl_display *display) : m_connection(display, *this)
 
 PickerService::~PickerService() = default;
 
-bool PickerService::connectToHost()
-{
-    // The first brings the globals; what the host has to say follows with the event loop.
-    return m_connection.roundtrip() && m_connection.isBound();
-}
-
 remote::RemoteViewController *PickerService::remoteViewController()
 {
     return m_front.get();
@@ -55,17 +49,25 @@ remote::RemoteViewController *PickerService::remoteViewController()
 
 void PickerService::traitsDidChange(const remote::Traits &traits)
 {
-    const bool first = !m_traits;
     applySurroundings(traits);
     m_traits = traits;
-    if (first)
+    if (m_front)
+        applyTraits();
+    else if (m_viewsAreLoaded)
         build();
-    m_front->eyedropper().setDisplayIdentifier(traits.displayIdentifier);
-    m_front->setTraits(traitCollection(traits));
-    if (!first)
-        return;
-    m_connection.sendReady();
-    QTimer::singleShot(quietTime, this, &PickerService::warmUp);
+}
+
+void PickerService::viewsDidLoad()
+{
+    m_viewsAreLoaded = true;
+    if (m_traits)
+        build();
+}
+
+void PickerService::applyTraits()
+{
+    m_front->eyedropper().setDisplayIdentifier(m_traits->displayIdentifier);
+    m_front->setTraits(traitCollection(*m_traits));
 }
 
 void PickerService::warmUp()
@@ -131,6 +133,10 @@ void PickerService::build()
     connect(m_window.get(), &QQuickWindow::heightChanged, this, &PickerService::followWindowSize);
     connect(m_front.get(), &service::FVColorPickerServiceFront::preferredContentSizeChanged, this,
             &PickerService::settleBeforePresenting);
+    applyTraits();
+    m_connection.sendReady();
+    m_connection.deliverEvents();
+    QTimer::singleShot(quietTime, this, &PickerService::warmUp);
 }
 
 void PickerService::settleBeforePresenting()

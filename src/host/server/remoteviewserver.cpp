@@ -222,12 +222,14 @@ void RemoteViewServer::touchCancel()
 void RemoteViewServer::setKeymap(const std::string &keymap)
 {
     d->seat.keyboard().setKeymap(keymap);
+    d->seat.offerKeyboard();
 }
 
 void RemoteViewServer::setKeymapFromNames(const std::string &rules, const std::string &model, const std::string &layout,
                                           const std::string &variant, const std::string &options)
 {
     d->seat.keyboard().setKeymap(Keymap::Names{rules, model, layout, variant, options});
+    d->seat.offerKeyboard();
 }
 
 void RemoteViewServer::setRepeat(int keysPerSecond, int delayMilliseconds)

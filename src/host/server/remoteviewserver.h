@@ -203,7 +203,10 @@ public:
     void touchFrame();
     void touchCancel();
 
-    /** The host's keymap as an XKB text, empty for the default keymap. A text that is no keymap changes nothing. */
+    /**
+     * The host's keymap as an XKB text, empty for the default keymap. A text that is no keymap changes nothing. The
+     * service is offered a keyboard when this or setKeymapFromNames() is called first.
+     */
     void setKeymap(const std::string &keymap);
     /** Layout names ("us", "de") for a host that cannot give its keymap. */
     void setKeymapFromNames(const std::string &rules, const std::string &model, const std::string &layout,

@@ -2,6 +2,8 @@
 
 #include "host/server/connection.h"
 
+#include <utility>
+
 #include <wayland-server-protocol.h>
 
 namespace favrin::host::server {
@@ -46,10 +48,23 @@ void Seat::bind(wl_client *client, int version, std::uint32_t id)
     wl_resource *seat = m_resources.add(client, wl_seat_interface, version, id, requests(), this);
     if (!seat)
         return;
-    wl_seat_send_capabilities(seat,
-                              WL_SEAT_CAPABILITY_POINTER | WL_SEAT_CAPABILITY_KEYBOARD | WL_SEAT_CAPABILITY_TOUCH);
+    sendCapabilities(seat);
     if (version >= WL_SEAT_NAME_SINCE_VERSION)
         wl_seat_send_name(seat, "host");
+}
+
+void Seat::offerKeyboard()
+{
+    if (!std::exchange(m_hasKeyboard, true))
+        m_resources.forEach([this](wl_resource *seat) { sendCapabilities(seat); });
+}
+
+void Seat::sendCapabilities(wl_resource *seat) const
+{
+    std::uint32_t capabilities = WL_SEAT_CAPABILITY_POINTER | WL_SEAT_CAPABILITY_TOUCH;
+    if (m_hasKeyboard)
+        capabilities |= WL_SEAT_CAPABILITY_KEYBOARD;
+    wl_seat_send_capabilities(seat, capabilities);
 }
 
 void Seat::setSurface(Surface *surface)

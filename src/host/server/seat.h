@@ -22,6 +22,8 @@ public:
     const Keyboard &keyboard() const { return m_keyboard; }
     Touch &touch() { return m_touch; }
 
+    /** There is a keyboard; until then there are a pointer and touches only. */
+    void offerKeyboard();
     /** Where input goes from now on; null takes it away. */
     void setSurface(Surface *surface);
     /** Before the owner waits: sends motion that was held back, if there is room now, and ends open groups of events.
@@ -31,11 +33,13 @@ public:
 private:
     static const void *requests();
     void bind(wl_client *client, int version, std::uint32_t id);
+    void sendCapabilities(wl_resource *seat) const;
 
     ResourceList m_resources;
     Pointer m_pointer;
     Keyboard m_keyboard;
     Touch m_touch;
+    bool m_hasKeyboard = false;
 };
 
 } // namespace favrin::host::server

@@ -48,7 +48,11 @@ public:
         Q_EMIT m_session.frameArrived();
     }
     void surfaceDidUnmap() override { m_session.m_surface.clear(); }
-    void serviceDidBind() override {}
+    void serviceDidBind() override
+    {
+        // When this turn is over, and the service has its answers.
+        QMetaObject::invokeMethod(&m_session, &RemoteViewSession::offerKeyboard, Qt::QueuedConnection);
+    }
     void serviceIsReady() override
     {
         m_session.m_ready = true;
@@ -146,10 +150,17 @@ void RemoteViewSession::attend()
     m_notifier = std::make_unique<QSocketNotifier>(m_server->fileDescriptor(), QSocketNotifier::Read);
     connect(m_notifier.get(), &QSocketNotifier::activated, this, &RemoteViewSession::dispatch);
     m_process->watch();
-    // Compiling a keymap takes longer than anything else here; meanwhile the process is being loaded.
+}
+
+void RemoteViewSession::offerKeyboard()
+{
+    if (m_ended)
+        return;
+    // Compiling a keymap takes either process longer than anything else here; the service is loading its views now.
     m_server->setKeymap(hostKeymap());
     const auto *hints = QGuiApplication::styleHints();
     m_server->setRepeat(static_cast<int>(hints->keyboardAutoRepeatRate()), hints->keyboardInputInterval());
+    m_server->flush();
 }
 
 QString RemoteViewSession::start()

@@ -93,6 +93,7 @@ private:
     class Delegate;
 
     void dispatch();
+    void offerKeyboard();
     void finish(const QString &error);
 
     RemoteSurface m_surface;

@@ -5,8 +5,10 @@
 #include "remote/wirecolor.h"
 
 #include <cstring>
+#include <functional>
 #include <thread>
 #include <utility>
+#include <vector>
 
 namespace favrin::remote::client {
 
@@ -30,8 +32,19 @@ struct RemoteViewConnection::Private : RemoteViewEventsReceiver
     RemoteViewConnectionDelegate &delegate;
     RemoteViewEvents events;
     wl_registry *registry = nullptr;
+    wl_callback *globals = nullptr;
     favrin_remote_view_v1 *view = nullptr;
     bool readySent = false;
+    bool delivers = false;
+    std::vector<std::function<void()>> waiting;
+
+    void deliver(std::function<void()> event)
+    {
+        if (delivers)
+            event();
+        else
+            waiting.push_back(std::move(event));
+    }
 
     static void global(void *data, wl_registry *registry, uint32_t name, const char *interface, uint32_t)
     {
@@ -43,36 +56,58 @@ struct RemoteViewConnection::Private : RemoteViewEventsReceiver
         favrin_remote_view_v1_add_listener(self->view, &RemoteViewEvents::listener(), &self->events);
     }
     static void globalRemove(void *, wl_registry *, uint32_t) {}
+    static void globalsDidArrive(void *data, wl_callback *callback, uint32_t)
+    {
+        auto *self = static_cast<Private *>(data);
+        wl_callback_destroy(callback);
+        self->globals = nullptr;
+        if (!self->view)
+            self->delegate.hostIsMissing();
+    }
 
     void flush() const { wl_display_flush(display); }
 
     void traitsDidArrive(const Traits &traits) override { delegate.traitsDidChange(traits); }
     void configurationDidArrive(const Configuration &configuration) override
     {
-        if (auto *controller = delegate.remoteViewController())
-            controller->setConfiguration(configuration);
+        deliver([this, configuration] {
+            if (auto *controller = delegate.remoteViewController())
+                controller->setConfiguration(configuration);
+        });
     }
     void selectedColorDidArrive(const std::optional<platform::Color> &color,
                                 const std::optional<std::string> &colorspace) override
     {
-        if (auto *controller = delegate.remoteViewController())
-            controller->setSelectedColor(color, colorspace);
+        deliver([this, color, colorspace] {
+            if (auto *controller = delegate.remoteViewController())
+                controller->setSelectedColor(color, colorspace);
+        });
     }
     void prepareForDisplayDidArrive(std::uint32_t serial) override
     {
-        if (auto *controller = delegate.remoteViewController()) {
-            controller->prepareForDisplay([this, serial] {
-                favrin_remote_view_v1_prepared(view, serial);
-                flush();
-            });
-        }
+        deliver([this, serial] {
+            if (auto *controller = delegate.remoteViewController()) {
+                controller->prepareForDisplay([this, serial] {
+                    favrin_remote_view_v1_prepared(view, serial);
+                    flush();
+                });
+            }
+        });
     }
-    void presentDidArrive() override { delegate.shouldPresent(); }
-    void focusWillEnterDidArrive(FocusDirection direction) override { delegate.focusWillEnter(direction); }
+    void presentDidArrive() override
+    {
+        deliver([this] { delegate.shouldPresent(); });
+    }
+    void focusWillEnterDidArrive(FocusDirection direction) override
+    {
+        deliver([this, direction] { delegate.focusWillEnter(direction); });
+    }
     void colorPickerDidFinishDidArrive() override
     {
-        if (auto *controller = delegate.remoteViewController())
-            controller->colorPickerDidFinish();
+        deliver([this] {
+            if (auto *controller = delegate.remoteViewController())
+                controller->colorPickerDidFinish();
+        });
     }
 };
 
@@ -83,6 +118,9 @@ RemoteViewConnection::RemoteViewConnection(wl_display *display, RemoteViewConnec
                                                       .global_remove = Private::globalRemove};
     d->registry = wl_display_get_registry(display);
     wl_registry_add_listener(d->registry, &listener, d.get());
+    static constexpr wl_callback_listener globalsListener = {.done = Private::globalsDidArrive};
+    d->globals = wl_display_sync(display);
+    wl_callback_add_listener(d->globals, &globalsListener, d.get());
     d->flush();
 }
 
@@ -90,18 +128,17 @@ RemoteViewConnection::~RemoteViewConnection()
 {
     if (d->view)
         favrin_remote_view_v1_destroy(d->view);
+    if (d->globals)
+        wl_callback_destroy(d->globals);
     wl_registry_destroy(d->registry);
     d->flush();
 }
 
-bool RemoteViewConnection::roundtrip()
+void RemoteViewConnection::deliverEvents()
 {
-    return wl_display_roundtrip(d->display) >= 0;
-}
-
-bool RemoteViewConnection::isBound() const
-{
-    return d->view != nullptr;
+    d->delivers = true;
+    for (const auto &event : std::exchange(d->waiting, {}))
+        event();
 }
 
 void RemoteViewConnection::sendReady()

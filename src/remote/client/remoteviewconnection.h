@@ -14,6 +14,8 @@ class RemoteViewConnectionDelegate
 {
 public:
     virtual ~RemoteViewConnectionDelegate() = default;
+    /** The other end is no host of ours; nothing else will come. */
+    virtual void hostIsMissing() = 0;
     /** Traits that belong together; they come once before anything else. Sanitised. */
     virtual void traitsDidChange(const Traits &traits) = 0;
     /** The app presents the picker now. */
@@ -36,15 +38,17 @@ public:
 class RemoteViewConnection : public RemoteHost
 {
 public:
-    /** Binds the host's global on @p display; the first events come with the next dispatch. */
+    /**
+     * Binds the host's global on @p display; the first events come with the next dispatch. All but the traits wait for
+     * deliverEvents().
+     */
     RemoteViewConnection(wl_display *display, RemoteViewConnectionDelegate &delegate);
     ~RemoteViewConnection() override;
     RemoteViewConnection(const RemoteViewConnection &) = delete;
     RemoteViewConnection &operator=(const RemoteViewConnection &) = delete;
 
-    /** Waits until the host has answered all that was sent so far. Only for start-up, before anything is shown. */
-    bool roundtrip();
-    bool isBound() const;
+    /** The picker is there to hear what the host says: delivers what waits, and from now on everything at once. */
+    void deliverEvents();
 
     /** Tells the host, once, that the picker could be shown at once. */
     void sendReady();

@@ -294,6 +294,10 @@ void ScriptedService::listenToInput()
         l.cancel = [](void *d, wl_touch *) { self(d).note("touch cancel"); };
         return l;
     }();
+    static const wl_seat_listener seats = {
+        .capabilities = [](void *d, wl_seat *, std::uint32_t all) { self(d).note(line("seat offers", all)); },
+        .name = [](void *, wl_seat *, const char *) {}};
+    wl_seat_add_listener(seat, &seats, this);
     wl_pointer_add_listener(pointer, &pointers, this);
     wl_keyboard_add_listener(keyboard, &keyboards, this);
     wl_touch_add_listener(touch, &touches, this);

@@ -87,6 +87,20 @@ private Q_SLOTS:
                                                         "touch up 5", "touch down 0 1 1", "touch cancel"}));
     }
 
+    void theKeyboardIsOfferedWithItsKeymap()
+    {
+        PresentedPair pair(Start::Unbound);
+        pair.service.bindAll();
+        pair.exchange();
+        const std::string pointerAndTouch = "seat offers 5";
+        const std::string keyboardToo = "seat offers 7";
+        QCOMPARE(pair.service.eventsOf("seat"), Lines{pointerAndTouch});
+        pair.server.setKeymap("");
+        pair.server.setKeymapFromNames("", "", "de", "", "");
+        pair.exchange();
+        QCOMPARE(pair.service.eventsOf("seat"), (Lines{pointerAndTouch, keyboardToo}));
+    }
+
     void theKeyboardSaysWhatTheKeysMean()
     {
         PresentedPair pair(Start::Unbound);
