@@ -7,7 +7,6 @@
 
 #include <QImage>
 #include <QPainter>
-#include <QPainterPath>
 
 namespace favrin::sliders {
 
@@ -27,21 +26,6 @@ OpacityBackground checkerboard()
     return {.squareSize = 12.0,
             .squareColor = SomeColor(0.851, 0.847, 0.855, 1.0, SomeColor::ColorSpace::displayP3),
             .colorScheme = Theme::instance().colorScheme()};
-}
-
-QPainterPath capsule(const QRectF &rect)
-{
-    QPainterPath path;
-    path.addRoundedRect(rect, rect.height() / 2.0, rect.height() / 2.0);
-    return path;
-}
-
-/** One pixel wide, inside the edge. */
-void strokeCapsule(QPainter &painter, const QRectF &rect)
-{
-    QColor outline = Theme::instance().systemGray();
-    outline.setAlphaF(outlineOpacity);
-    painter.strokePath(capsule(rect.adjusted(0.5, 0.5, -0.5, -0.5)), QPen(outline, 1.0));
 }
 
 } // namespace
@@ -104,21 +88,36 @@ QLinearGradient SliderTrack::gradient(int width) const
     return gradient;
 }
 
+QImage SliderTrack::row(int width) const
+{
+    QImage row(width, 1, QImage::Format_ARGB32_Premultiplied);
+    row.fill(Qt::transparent);
+    QPainter(&row).fillRect(row.rect(), gradient(width));
+    return row;
+}
+
 void SliderTrack::paint(QPainter &painter, QSize size, double devicePixelRatio)
 {
-    const QRect rect(QPoint(), size);
-    if (m_component != ColorComponent::Opacity) {
-        painter.fillPath(capsule(rect), gradient(size.width()));
-        return;
+    if (m_capsule.size() != size)
+        m_capsule = Capsule(size);
+    QImage picture(size, QImage::Format_ARGB32_Premultiplied);
+    QPainter layers(&picture);
+    if (m_component == ColorComponent::Opacity)
+        checkerboard().paint(layers, size, devicePixelRatio, Theme::instance().layoutDirection());
+    else
+        layers.setCompositionMode(QPainter::CompositionMode_Source);
+    const QImage colors = row(size.width());
+    for (int y = 0; y < size.height(); ++y)
+        layers.drawImage(0, y, colors);
+    // All layers are cut as one; cut apart, the lower one would shine through at the edge.
+    m_capsule.cut(layers);
+    layers.end();
+    painter.drawImage(0, 0, picture);
+    if (m_component == ColorComponent::Opacity) {
+        QColor outline = Theme::instance().systemGray();
+        outline.setAlphaF(outlineOpacity);
+        m_capsule.outline(painter, outline);
     }
-    // Both layers are cut as one; cut apart, the lower one would shine through at the edge.
-    QImage layers(size, QImage::Format_ARGB32_Premultiplied);
-    QPainter layerPainter(&layers);
-    checkerboard().paint(layerPainter, size, devicePixelRatio, Theme::instance().layoutDirection());
-    layerPainter.fillRect(rect, gradient(size.width()));
-    layerPainter.end();
-    painter.fillPath(capsule(rect), QBrush(layers));
-    strokeCapsule(painter, rect);
 }
 
 } // namespace favrin::sliders

@@ -2,6 +2,7 @@
 
 #include "platform/shapes/crisppainteditem.h"
 #include "service/colorpickerstate.h"
+#include "sliders/capsule.h"
 #include "sliders/colorcomponent.h"
 
 #include <QLinearGradient>
@@ -43,10 +44,13 @@ private:
     Stops stops() const;
     void updateStops();
     QLinearGradient gradient(int width) const;
+    /** All rows of the track are alike. */
+    QImage row(int width) const;
 
     QPointer<service::ColorPickerState> m_state;
     ColorComponent::Name m_component = ColorComponent::Red;
     Stops m_stops;
+    Capsule m_capsule;
 };
 
 } // namespace favrin::sliders
