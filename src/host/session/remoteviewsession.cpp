@@ -178,10 +178,15 @@ void RemoteViewSession::end()
     m_notifier.reset();
     if (m_process->processIdentifier() == 0)
         return;
+    auto ending = std::exchange(m_process, std::make_unique<ServiceProcess>());
+    auto *application = QCoreApplication::instance();
+    // While the app itself goes, there is nobody left to wait, and no need: what does not leave by itself goes with it.
+    if (!application)
+        return;
     // The process object stays behind to reap what leaves, and to end what does not; at the latest it goes with the
     // app.
-    auto *process = std::exchange(m_process, std::make_unique<ServiceProcess>()).release();
-    process->setParent(QCoreApplication::instance());
+    auto *process = ending.release();
+    process->setParent(application);
     process->disconnect(this);
     connect(process, &ServiceProcess::ended, process, &QObject::deleteLater);
     QTimer::singleShot(timeToLeave, process, &ServiceProcess::kill);
