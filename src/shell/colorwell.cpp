@@ -75,15 +75,20 @@ void ColorWell::paint(QPainter &painter, QSize size, double devicePixelRatio)
     const QRect bounds(QPoint(), size);
     const auto color = m_state ? m_state->selectedColor() : std::nullopt;
     if (color) {
-        painter.fillRect(bounds, display.interfaceColor(Qt::white));
-        painter.fillPath(triangle(bounds), display.interfaceColor(Qt::black));
+        if (color->a < 1.0) {
+            painter.fillRect(bounds, display.interfaceColor(Qt::white));
+            painter.fillPath(triangle(bounds), display.interfaceColor(Qt::black));
+        }
         painter.fillRect(bounds, display.color(*color));
     } else {
         painter.fillRect(bounds, Theme::instance().systemGray5());
         painter.fillPath(slash(bounds, devicePixelRatio), Theme::instance().systemRed());
     }
-    platform::ShapeView{platform::continuousRoundedRect(bounds, cornerRadius() * devicePixelRatio)}.mask(painter,
-                                                                                                         bounds);
+    if (m_shape.size() != size)
+        m_shape =
+            platform::ShapeView{platform::continuousRoundedRect(bounds, cornerRadius() * devicePixelRatio)}.picture(
+                bounds);
+    platform::ShapeView::mask(painter, {}, m_shape);
 }
 
 void ColorWell::keyPressEvent(QKeyEvent *event)

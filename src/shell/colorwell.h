@@ -4,6 +4,7 @@
 #include "platform/shapes/crisppainteditem.h"
 #include "service/colorpickerstate.h"
 
+#include <QImage>
 #include <QPointer>
 #include <QtQmlIntegration/qqmlintegration.h>
 
@@ -48,6 +49,8 @@ protected:
 private:
     QPointer<service::ColorPickerState> m_state;
     platform::FocusVisibility m_focusVisibility;
+    /** Of the well's present size. */
+    QImage m_shape;
 };
 
 } // namespace favrin::shell

@@ -11,6 +11,10 @@ FieldBackground {
     required property CPTextFieldCoordinator coordinator
 
     readonly property real padding: 4
+    readonly property int pixelSize: Theme.bodyFont.pixelSize
+    /* Short texts need no measuring, which would take a good part of every step of a drag. */
+    readonly property bool fits: input.width <= 0 || (input.length + 1) * widest.advanceWidth <= input.width
+                                 || metrics.advanceWidth <= input.width
 
     /* Where fingers type on the screen itself, with no room for a keyboard that closes by itself. */
     property bool isPhone: Math.min(Screen.width, Screen.height) < 600
@@ -32,7 +36,7 @@ FieldBackground {
         selectByMouse: true
         activeFocusOnTab: true
         font.family: Theme.bodyFont.family
-        font.pixelSize: Math.floor(metrics.font.pixelSize * (width > 0 ? Math.min(width / metrics.advanceWidth, 1) : 1))
+        font.pixelSize: field.fits ? field.pixelSize : Math.floor(field.pixelSize * width / metrics.advanceWidth)
         font.weight: Font.Medium
         color: field.colorPickerState.hasSelectedColor ? Theme.label : Theme.tertiaryLabel
         selectionColor: Theme.tint
@@ -58,9 +62,16 @@ FieldBackground {
         id: metrics
 
         font.family: Theme.bodyFont.family
-        font.pixelSize: Theme.bodyFont.pixelSize
+        font.pixelSize: field.pixelSize
         font.weight: Font.Medium
         text: input.text + "0"
+    }
+
+    TextMetrics {
+        id: widest
+
+        font: metrics.font
+        text: "W"
     }
 
     FocusRing {

@@ -33,8 +33,12 @@ OpacityBackground checkerboard()
 SliderTrack::SliderTrack(QQuickItem *parent) : CrispPaintedItem(parent), m_stops(stops())
 {
     // Comes with a change of the surface's color space too.
-    connect(&Theme::instance(), &Theme::colorsChanged, this, [this] { repaint(); });
-    connect(&Theme::instance(), &Theme::layoutDirectionChanged, this, [this] { repaint(); });
+    const auto startAgain = [this] {
+        m_checkerboard = {};
+        repaint();
+    };
+    connect(&Theme::instance(), &Theme::colorsChanged, this, startAgain);
+    connect(&Theme::instance(), &Theme::layoutDirectionChanged, this, startAgain);
 }
 
 void SliderTrack::setColorPickerState(ColorPickerState *state)
@@ -96,15 +100,24 @@ QImage SliderTrack::row(int width) const
     return row;
 }
 
+QImage SliderTrack::background(QSize size, double devicePixelRatio)
+{
+    if (m_checkerboard.size() != size) {
+        m_checkerboard = QImage(size, QImage::Format_ARGB32_Premultiplied);
+        QPainter painter(&m_checkerboard);
+        checkerboard().paint(painter, size, devicePixelRatio, Theme::instance().layoutDirection());
+    }
+    return m_checkerboard;
+}
+
 void SliderTrack::paint(QPainter &painter, QSize size, double devicePixelRatio)
 {
     if (m_capsule.size() != size)
         m_capsule = Capsule(size);
-    QImage picture(size, QImage::Format_ARGB32_Premultiplied);
+    const bool isOpacity = m_component == ColorComponent::Opacity;
+    QImage picture = isOpacity ? background(size, devicePixelRatio) : QImage(size, QImage::Format_ARGB32_Premultiplied);
     QPainter layers(&picture);
-    if (m_component == ColorComponent::Opacity)
-        checkerboard().paint(layers, size, devicePixelRatio, Theme::instance().layoutDirection());
-    else
+    if (!isOpacity)
         layers.setCompositionMode(QPainter::CompositionMode_Source);
     const QImage colors = row(size.width());
     for (int y = 0; y < size.height(); ++y)
@@ -113,7 +126,7 @@ void SliderTrack::paint(QPainter &painter, QSize size, double devicePixelRatio)
     m_capsule.cut(layers);
     layers.end();
     painter.drawImage(0, 0, picture);
-    if (m_component == ColorComponent::Opacity) {
+    if (isOpacity) {
         QColor outline = Theme::instance().systemGray();
         outline.setAlphaF(outlineOpacity);
         m_capsule.outline(painter, outline);

@@ -46,11 +46,14 @@ private:
     QLinearGradient gradient(int width) const;
     /** All rows of the track are alike. */
     QImage row(int width) const;
+    /** What lies behind the opacity. Kept, since no color changes it. */
+    QImage background(QSize size, double devicePixelRatio);
 
     QPointer<service::ColorPickerState> m_state;
     ColorComponent::Name m_component = ColorComponent::Red;
     Stops m_stops;
     Capsule m_capsule;
+    QImage m_checkerboard;
 };
 
 } // namespace favrin::sliders
