@@ -90,14 +90,17 @@ def statistics(folder, name):
             "symbols": largest("number of relocations"), "relative": largest("number of relative relocations")}
 
 
-def clock_rate():
-    lines = [line for line in open("/proc/cpuinfo") if line.startswith("cpu MHz")]
-    return float(lines[0].split(":")[1]) * 1e6
+def clock_rate(linker_clock):
+    """How many of the dynamic linker's cycles, as it prints them, are a second."""
+    environment = {**os.environ, "LD_DEBUG": "statistics"}
+    said = subprocess.run([linker_clock], env=environment, capture_output=True, text=True, check=True).stderr
+    return int(re.search(r"total startup time in dynamic loader: (\d+)", said)[1]) / 0.05
 
 
 def linking(watch, programs, service, rounds):
     """For each program what linking it took. The service starts by a script, since it inherits no variables of ours."""
     results = {name: [] for name in [*programs, "favrin-color-picker-service"]}
+    rate = clock_rate(pathlib.Path(watch).with_name("linker-clock"))
     with tempfile.TemporaryDirectory() as scratch:
         script = pathlib.Path(scratch, "service")
         script.write_text(f'#!/bin/sh\nLD_DEBUG=statistics LD_DEBUG_OUTPUT={scratch}/linked exec "{service}"\n')
@@ -111,8 +114,8 @@ def linking(watch, programs, service, rounds):
                 found = {name: statistics(scratch, "program"), "favrin-color-picker-service": statistics(scratch, "linked")}
                 for program, numbers in found.items():
                     if turn and numbers["cycles"]:
-                        results[program].append({**numbers, "ms": numbers["cycles"] / clock_rate() * 1000,
-                                                 "relocation_ms": numbers["relocation_cycles"] / clock_rate() * 1000})
+                        results[program].append({**numbers, "ms": numbers["cycles"] / rate * 1000,
+                                                 "relocation_ms": numbers["relocation_cycles"] / rate * 1000})
                 for file in pathlib.Path(scratch).glob("*.*"):
                     file.unlink()
     return results
