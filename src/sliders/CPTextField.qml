@@ -12,6 +12,7 @@ FieldBackground {
 
     readonly property real padding: 4
     readonly property int pixelSize: Theme.bodyFont.pixelSize
+    readonly property string widestLetter: "W"
     /* Short texts need no measuring, which would take a good part of every step of a drag. */
     readonly property bool fits: input.width <= 0 || (input.length + 1) * widest.advanceWidth <= input.width
                                  || metrics.advanceWidth <= input.width
@@ -71,7 +72,7 @@ FieldBackground {
         id: widest
 
         font: metrics.font
-        text: "W"
+        text: field.widestLetter
     }
 
     FocusRing {
