@@ -84,7 +84,7 @@ int main(int argc, char *argv[])
     QGuiApplication::setApplicationName(QStringLiteral("favrin-color-picker-service"));
     QGuiApplication::setDesktopFileName(QStringLiteral("favrin-color-picker"));
     // Items start with this font until they have heard of their own: so it should be one that is needed anyhow.
-    QGuiApplication::setFont(Theme::usualFonts().first());
+    QGuiApplication::setFont(Theme::usualFonts().constFirst());
     const std::jthread fonts = fontLookUp();
     // The host shows its own pointer; loading a theme of pointers here would cost the first touch of a drag 20 ms.
     QGuiApplication::setOverrideCursor(Qt::BlankCursor);
