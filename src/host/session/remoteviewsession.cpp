@@ -189,6 +189,7 @@ void RemoteViewSession::end()
     process->setParent(application);
     process->disconnect(this);
     connect(process, &ServiceProcess::ended, process, &QObject::deleteLater);
+    process->awaitEnd();
     QTimer::singleShot(timeToLeave, process, &ServiceProcess::kill);
 }
 

@@ -1,6 +1,7 @@
 #include "host/session/serviceprocess.h"
 
 #include <QSocketNotifier>
+#include <QTimer>
 
 #include <csignal>
 
@@ -11,6 +12,10 @@
 namespace favrin::host {
 
 namespace {
+
+using namespace std::chrono_literals;
+
+constexpr auto timeBetweenLooks = 20ms;
 
 QString describe(const siginfo_t &info)
 {
@@ -46,17 +51,34 @@ void ServiceProcess::watch()
 
 void ServiceProcess::kill()
 {
-    if (m_pid > 0)
-        ::kill(m_pid, SIGKILL);
+    if (m_pid <= 0)
+        return;
+    ::kill(m_pid, SIGKILL);
+    awaitEnd();
+}
+
+void ServiceProcess::awaitEnd()
+{
+    if (m_pidDescriptor >= 0 || m_pid <= 0 || m_look)
+        return;
+    m_look = std::make_unique<QTimer>();
+    connect(m_look.get(), &QTimer::timeout, this, &ServiceProcess::reap);
+    m_look->start(timeBetweenLooks);
 }
 
 void ServiceProcess::reap()
 {
     siginfo_t info = {};
     // An app that reaps all children itself leaves nothing to wait for; the process has ended all the same.
-    const bool known = waitid(P_PID, static_cast<id_t>(m_pid), &info, WEXITED | WNOHANG) == 0 && info.si_pid == m_pid;
+    const bool isChild = waitid(P_PID, static_cast<id_t>(m_pid), &info, WEXITED | WNOHANG) == 0;
+    const bool known = isChild && info.si_pid == m_pid;
+    if (isChild && !known && m_look)
+        return;
     m_pid = 0;
-    m_notifier->setEnabled(false);
+    if (m_notifier)
+        m_notifier->setEnabled(false);
+    if (m_look)
+        m_look->stop();
     Q_EMIT ended(known ? describe(info) : QStringLiteral("ended"));
 }
 

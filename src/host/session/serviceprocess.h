@@ -8,6 +8,7 @@
 #include <sys/types.h>
 
 class QSocketNotifier;
+class QTimer;
 
 namespace favrin::host {
 
@@ -29,6 +30,11 @@ public:
     /** 0 when nothing runs. */
     pid_t processIdentifier() const { return m_pid; }
     void kill();
+    /**
+     * The process is to end now, by itself or because it was killed. Where the system has no descriptors of processes,
+     * as in some containers, nothing tells of it: from here on this looks for itself.
+     */
+    void awaitEnd();
 
 Q_SIGNALS:
     /** @p description says how it ended, e.g. "exit status 1" or "signal 9". */
@@ -40,6 +46,7 @@ private:
     pid_t m_pid = 0;
     int m_pidDescriptor = -1;
     std::unique_ptr<QSocketNotifier> m_notifier;
+    std::unique_ptr<QTimer> m_look;
 };
 
 } // namespace favrin::host
