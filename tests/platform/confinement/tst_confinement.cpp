@@ -164,6 +164,7 @@ private Q_SLOTS:
         row("make a socket elsewhere", EACCES, [this] { return binding(m_outside / "socket"); });
         row("make a pipe elsewhere", EACCES, [this] { return errorOf(::mkfifo((m_outside / "p").c_str(), 0600)); });
         row("read the parent's memory", EACCES, [] { return readingOfParent("mem"); });
+        row("read the parent's environment", EACCES, [] { return readingOfParent("environ"); });
         row("enter the parent's root", EACCES, [] { return readingOfParent("root/etc"); });
         row("write to a device that was named", 0, [] { return writing("/dev/null"); });
         row("write to another device", EACCES, [] { return writing("/dev/zero"); });
