@@ -20,8 +20,10 @@ void OlderKernelTest::init()
 {
     static const bool forbidden = [] {
         scmp_filter_ctx rules = seccomp_init(SCMP_ACT_ALLOW);
-        return seccomp_rule_add(rules, SCMP_ACT_ERRNO(ENOSYS), SCMP_SYS(pidfd_open), 0) == 0 &&
-               seccomp_load(rules) == 0;
+        const bool loaded =
+            seccomp_rule_add(rules, SCMP_ACT_ERRNO(ENOSYS), SCMP_SYS(pidfd_open), 0) == 0 && seccomp_load(rules) == 0;
+        seccomp_release(rules);
+        return loaded;
     }();
     QVERIFY(forbidden);
 }
