@@ -34,7 +34,6 @@ public:
         }
     }
     void surfaceDidUnmap() override {}
-    void serviceDidBind() override {}
     void serviceIsReady() override {}
     void serviceDidPrepare(std::uint32_t) override {}
     void pickerDidSelectColor(const std::optional<favrin::platform::Color> &color, const std::optional<std::string> &,

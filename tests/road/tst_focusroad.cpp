@@ -48,6 +48,7 @@ private Q_SLOTS:
     void entersWhereItComesFrom();
     void goesRoundWhereThereIsNothingElse();
     void staysInAPresentedPicker();
+    void takesWhatIsTypedBeforeItHasItsKeyboard();
 };
 
 void FocusRoadTest::goesThroughAnEmbeddedPicker_data()
@@ -124,6 +125,21 @@ void FocusRoadTest::staysInAPresentedPicker()
     host.picker.dismiss();
     QTRY_COMPARE(host.picker.state(), State::NotRunning);
     QVERIFY(host.before.hasActiveFocus());
+}
+
+void FocusRoadTest::takesWhatIsTypedBeforeItHasItsKeyboard()
+{
+    HostWithElements host;
+    connect(&host.picker, &FVColorPickerViewController::stateChanged, &host.window, [&host] {
+        if (!host.isReady())
+            return;
+        for (const Qt::Key key : {Qt::Key_Tab, Qt::Key_Tab, Qt::Key_Tab, Qt::Key_Tab, Qt::Key_Down})
+            QTest::keyClick(&host.window, key);
+    });
+    host.picker.present(&host.window);
+    // Close button, eyedropper, tab picker, and the grid, whose keys pick.
+    QTRY_VERIFY(!host.picks.empty());
+    QVERIFY(!host.picks.back().isVolatile);
 }
 
 QTEST_MAIN(FocusRoadTest)

@@ -18,6 +18,8 @@ namespace {
 constexpr int privateMappingVersion = 7;
 /** What a keyboard can hold down at a time, generously. */
 constexpr std::size_t mostPressedKeys = 64;
+/** More than anybody types while a picker starts. */
+constexpr std::size_t mostHeldKeys = 128;
 
 } // namespace
 
@@ -38,6 +40,7 @@ void Keyboard::bind(wl_client *client, int version, std::uint32_t id)
     sendRepeat(keyboard);
     if (m_surface.get() && m_hasFocus)
         sendEnter(keyboard);
+    sendHeld();
 }
 
 void Keyboard::setSurface(Surface *surface)
@@ -45,6 +48,7 @@ void Keyboard::setSurface(Surface *surface)
     m_surface.reset(surface ? surface->handle() : nullptr);
     if (surface && m_hasFocus)
         m_resources.forEach([this](wl_resource *keyboard) { sendEnter(keyboard); });
+    sendHeld();
 }
 
 void Keyboard::setKeymap(const std::string &text)
@@ -73,10 +77,13 @@ void Keyboard::enter()
     m_pressed.clear();
     if (m_surface.get())
         m_resources.forEach([this](wl_resource *keyboard) { sendEnter(keyboard); });
+    sendHeld();
 }
 
 void Keyboard::leave()
 {
+    if (m_held)
+        m_held->clear();
     if (!std::exchange(m_hasFocus, false) || !m_surface.get() || !m_connection.admitsEvent())
         return;
     const std::uint32_t serial = m_connection.nextSerial();
@@ -87,19 +94,51 @@ void Keyboard::press(std::uint32_t time, std::uint32_t key, bool pressed)
 {
     if (!m_hasFocus)
         return;
-    std::erase(m_pressed, key);
-    if (pressed && m_pressed.size() < mostPressedKeys)
-        m_pressed.push_back(key);
+    if (m_held)
+        hold({time, key, pressed, m_modifiers});
+    else
+        send({time, key, pressed, m_modifiers});
+}
+
+void Keyboard::hold(const Key &key)
+{
+    // A release without its press means nothing to anybody; a press without its release would repeat forever.
+    if (m_held->size() == mostHeldKeys)
+        m_held->pop_front();
+    m_held->push_back(key);
+}
+
+void Keyboard::sendHeld()
+{
+    if (!m_held || !isReachable())
+        return;
+    const Modifiers now = m_modifiers;
+    const auto held = std::exchange(m_held, std::nullopt);
+    for (const Key &key : *held) {
+        setModifiers(key.modifiers.depressed, key.modifiers.latched, key.modifiers.locked, key.modifiers.group);
+        send(key);
+    }
+    setModifiers(now.depressed, now.latched, now.locked, now.group);
+}
+
+void Keyboard::send(const Key &key)
+{
+    std::erase(m_pressed, key.code);
+    if (key.pressed && m_pressed.size() < mostPressedKeys)
+        m_pressed.push_back(key.code);
     if (!m_surface.get() || !m_connection.admitsEvent())
         return;
     const std::uint32_t serial = m_connection.nextInputSerial();
-    const auto state = pressed ? WL_KEYBOARD_KEY_STATE_PRESSED : WL_KEYBOARD_KEY_STATE_RELEASED;
-    m_resources.forEach([&](wl_resource *keyboard) { wl_keyboard_send_key(keyboard, serial, time, key, state); });
+    const auto state = key.pressed ? WL_KEYBOARD_KEY_STATE_PRESSED : WL_KEYBOARD_KEY_STATE_RELEASED;
+    m_resources.forEach(
+        [&](wl_resource *keyboard) { wl_keyboard_send_key(keyboard, serial, key.time, key.code, state); });
 }
 
 void Keyboard::setModifiers(std::uint32_t depressed, std::uint32_t latched, std::uint32_t locked, std::uint32_t group)
 {
-    m_modifiers = {depressed, latched, locked, group};
+    const Modifiers modifiers = {depressed, latched, locked, group};
+    if (std::exchange(m_modifiers, modifiers) == modifiers)
+        return;
     if (m_hasFocus && m_surface.get())
         m_resources.forEach([this](wl_resource *keyboard) { sendModifiers(keyboard); });
 }

@@ -3,6 +3,8 @@
 #include "host/server/keymap.h"
 #include "host/server/resource.h"
 
+#include <deque>
+#include <optional>
 #include <vector>
 
 namespace favrin::host::server {
@@ -10,7 +12,10 @@ namespace favrin::host::server {
 class Connection;
 class Surface;
 
-/** wl_keyboard: keymap, focus, keys and modifiers. */
+/**
+ * wl_keyboard: keymap, focus, keys and modifiers. What is typed into a picker that is still starting waits until the
+ * picker has its keyboard and its surface.
+ */
 class Keyboard
 {
 public:
@@ -38,9 +43,23 @@ private:
         std::uint32_t latched = 0;
         std::uint32_t locked = 0;
         std::uint32_t group = 0;
+
+        bool operator==(const Modifiers &) const = default;
+    };
+
+    struct Key
+    {
+        std::uint32_t time = 0;
+        std::uint32_t code = 0;
+        bool pressed = false;
+        Modifiers modifiers;
     };
 
     static const void *requests();
+    bool isReachable() const { return m_hasFocus && m_surface.get() && !m_resources.isEmpty(); }
+    void hold(const Key &key);
+    void sendHeld();
+    void send(const Key &key);
     void sendKeymap(wl_resource *keyboard);
     void sendKeymap();
     void sendRepeat(wl_resource *keyboard);
@@ -53,6 +72,8 @@ private:
     Keymap m_keymap;
     Modifiers m_modifiers;
     std::vector<std::uint32_t> m_pressed;
+    /** In their order; none any more once the service could be reached. */
+    std::optional<std::deque<Key>> m_held = std::deque<Key>();
     bool m_hasFocus = false;
     int m_keysPerSecond = 25;
     int m_delayMilliseconds = 600;

@@ -90,7 +90,6 @@ void RemoteView::bind(wl_client *client, int version, std::uint32_t id)
     }
     m_view.reset(view);
     m_connection.setLimitObject(view);
-    m_connection.delegate().serviceDidBind();
     settle();
 }
 

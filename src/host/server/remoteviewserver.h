@@ -86,7 +86,6 @@ public:
     /** The picker took its surface away; not called when the connection ends. */
     virtual void surfaceDidUnmap() = 0;
 
-    virtual void serviceDidBind() = 0;
     virtual void serviceIsReady() = 0;
     virtual void serviceDidPrepare(std::uint32_t serial) = 0;
     /** @p colorspace is the name that the message to the app carries; a color may have a space and come without it. */
@@ -205,7 +204,7 @@ public:
 
     /**
      * The host's keymap as an XKB text, empty for the default keymap. A text that is no keymap changes nothing. The
-     * service is offered a keyboard when this or setKeymapFromNames() is called first.
+     * service is offered a keyboard when this or setKeymapFromNames() is called first; what is typed until then waits.
      */
     void setKeymap(const std::string &keymap);
     /** Layout names ("us", "de") for a host that cannot give its keymap. */

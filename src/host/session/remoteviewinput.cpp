@@ -63,8 +63,7 @@ void RemoteViewInput::frameWasShown()
 {
     if (!m_session || m_session->hasEnded())
         return;
-    m_session->server().frameWasShown(m_session->now());
-    m_session->flush();
+    m_session->frameWasShown();
 }
 
 void RemoteViewInput::focusIn(Qt::FocusReason reason)

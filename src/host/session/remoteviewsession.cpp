@@ -7,7 +7,6 @@
 #include <QGuiApplication>
 #include <QSocketNotifier>
 #include <QStyleHints>
-#include <QTimer>
 
 #include <cstring>
 
@@ -19,6 +18,12 @@ namespace {
 
 /** A service that lost its host leaves within milliseconds; one that does not is stuck. */
 constexpr auto timeToLeave = 1000ms;
+/**
+ * The picker gets its keyboard, which takes either process longer than anything else here, when its first frame is on
+ * the display; a picker that was started ahead, when its start is surely over. What is typed meanwhile waits.
+ */
+constexpr auto firstFrameToKeyboard = 20ms;
+constexpr auto readyToKeyboard = 1000ms;
 
 QString closeText(server::CloseReason reason, const std::string &detail)
 {
@@ -48,14 +53,10 @@ public:
         Q_EMIT m_session.frameArrived();
     }
     void surfaceDidUnmap() override { m_session.m_surface.clear(); }
-    void serviceDidBind() override
-    {
-        // When this turn is over, and the service has its answers.
-        QMetaObject::invokeMethod(&m_session, &RemoteViewSession::offerKeyboard, Qt::QueuedConnection);
-    }
     void serviceIsReady() override
     {
         m_session.m_ready = true;
+        m_session.m_keyboardTimer.start(readyToKeyboard);
         Q_EMIT m_session.ready();
     }
     void serviceDidPrepare(std::uint32_t serial) override { Q_EMIT m_session.prepared(serial); }
@@ -117,6 +118,8 @@ RemoteViewSession::RemoteViewSession(QObject *parent)
     , m_process(std::make_unique<ServiceProcess>())
 {
     m_clock.start();
+    m_keyboardTimer.setSingleShot(true);
+    connect(&m_keyboardTimer, &QTimer::timeout, this, &RemoteViewSession::offerKeyboard);
 }
 
 RemoteViewSession::~RemoteViewSession()
@@ -128,6 +131,14 @@ void RemoteViewSession::flush()
 {
     m_server->flush();
     Q_EMIT told();
+}
+
+void RemoteViewSession::frameWasShown()
+{
+    m_server->frameWasShown(now());
+    flush();
+    if (!std::exchange(m_wasShown, true) && m_keyboardTimer.isActive())
+        m_keyboardTimer.start(firstFrameToKeyboard);
 }
 
 QString RemoteViewSession::adopt(LaunchedService service)
@@ -156,7 +167,6 @@ void RemoteViewSession::offerKeyboard()
 {
     if (m_ended)
         return;
-    // Compiling a keymap takes either process longer than anything else here; the service is loading its views now.
     m_server->setKeymap(hostKeymap());
     const auto *hints = QGuiApplication::styleHints();
     m_server->setRepeat(static_cast<int>(hints->keyboardAutoRepeatRate()), hints->keyboardInputInterval());

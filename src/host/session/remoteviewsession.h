@@ -7,6 +7,7 @@
 #include <QElapsedTimer>
 #include <QObject>
 #include <QSizeF>
+#include <QTimer>
 
 #include <memory>
 
@@ -50,6 +51,8 @@ public:
     /** Messages and input go to the server directly; call flush() behind them. */
     server::RemoteViewServer &server() { return *m_server; }
     void flush();
+    /** The newest frame of the service is on the screen: it may draw the next. */
+    void frameWasShown();
     /** Takes in what has arrived, without waiting for the event loop. */
     void receive() { dispatch(); }
     /** end(), and deletes this object when nothing of it is in use any more. */
@@ -102,10 +105,12 @@ private:
     std::unique_ptr<ServiceProcess> m_process;
     std::unique_ptr<QSocketNotifier> m_notifier;
     QElapsedTimer m_clock;
+    QTimer m_keyboardTimer;
     server::TextInputState m_textInput;
     remote::BackgroundEffect m_backgroundEffect = remote::BackgroundEffect::None;
     QSizeF m_preferredContentSize = QSizeF(0, 0);
     bool m_ready = false;
+    bool m_wasShown = false;
     bool m_ended = false;
     bool m_telling = false;
     bool m_abandoned = false;

@@ -41,7 +41,6 @@ public:
             onFrame();
     }
     void surfaceDidUnmap() override { calls.push_back("unmap"); }
-    void serviceDidBind() override { calls.push_back("bind"); }
     void serviceIsReady() override { calls.push_back("ready"); }
     void serviceDidPrepare(std::uint32_t serial) override { calls.push_back("prepared " + std::to_string(serial)); }
     void pickerDidSelectColor(const std::optional<favrin::platform::Color> &color,

@@ -64,8 +64,38 @@ private Q_SLOTS:
         pair.service.commit(pair.service.makeBuffer(20, 10, 0), 20, 10);
         pair.exchange();
         QCOMPARE(pair.service.eventsOf("pointer"), (Lines{"pointer enter 4 4", "pointer frame"}));
-        QCOMPARE(pair.service.eventsOf("keyboard"), (Lines{"keyboard enter 1", "keyboard modifiers 1 0 2 0"}));
+        QCOMPARE(pair.service.eventsOf("keyboard"),
+                 (Lines{"keyboard enter 0", "keyboard modifiers 1 0 2 0", "keyboard key 30 1"}));
         QVERIFY(pair.service.eventsOf("touch").empty());
+    }
+
+    void keysWaitForThePickersKeyboard()
+    {
+        PresentedPair pair(Start::Unbound);
+        auto &server = pair.server;
+        server.keyboardEnter();
+        server.keyboardKey(1, 16, true);
+        server.keyboardLeave();
+        server.keyboardEnter();
+        for (std::uint32_t time = 0; time < 1000; ++time)
+            server.keyboardKey(time, 15, time % 2 == 0);
+        server.keyboardModifiers(1, 0, 0, 0);
+        server.keyboardKey(1000, 30, true);
+        server.keyboardModifiers(0, 0, 0, 0);
+        server.keyboardKey(1001, 30, false);
+        pair.service.bindAll();
+        pair.service.makeToplevel();
+        pair.exchange();
+        pair.service.acknowledge();
+        pair.service.commit(pair.service.makeBuffer(20, 10, 0), 20, 10);
+        pair.exchange();
+        // Of keys without end the newest; and none that was meant for another place.
+        Lines events = pair.service.eventsOf("keyboard");
+        QCOMPARE(pair.service.eventsOf("keyboard key ").size(), std::size_t(128));
+        QCOMPARE(pair.service.eventsOf("keyboard key 16").size(), std::size_t(0));
+        QCOMPARE(Lines(events.end() - 6, events.end()),
+                 (Lines{"keyboard key 15 1", "keyboard key 15 0", "keyboard modifiers 1 0 0 0", "keyboard key 30 1",
+                        "keyboard modifiers 0 0 0 0", "keyboard key 30 0"}));
     }
 
     void touchesKeepTheirOrderAndTheirFingers()
