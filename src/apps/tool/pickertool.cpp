@@ -85,6 +85,8 @@ void PickerTool::start()
     m_window->resize(firstSize);
     m_window->installEventFilter(this);
     m_picker->present([this] { return std::make_unique<host::WindowPlace>(*m_window); });
+    // While the picker starts: the display server is asked a dozen questions for it.
+    m_window->create();
     if (m_options.timeout)
         m_timeout.start(*m_options.timeout);
 }

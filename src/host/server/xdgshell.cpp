@@ -55,9 +55,10 @@ void XdgShell::bind(wl_client *client, int version, std::uint32_t id)
 
 void XdgShell::configure(int width, int height)
 {
-    m_width = std::clamp(width, 1, remote::limits::largestSurface);
-    m_height = std::clamp(height, 1, remote::limits::largestSurface);
-    if (m_toplevel)
+    const int oldWidth = std::exchange(m_width, std::clamp(width, 1, remote::limits::largestSurface));
+    const int oldHeight = std::exchange(m_height, std::clamp(height, 1, remote::limits::largestSurface));
+    // A service draws a new frame for whatever it is told.
+    if (m_toplevel && (m_width != oldWidth || m_height != oldHeight))
         m_toplevel->reconfigure();
 }
 

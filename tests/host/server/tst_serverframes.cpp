@@ -228,6 +228,9 @@ private Q_SLOTS:
         pair.service.acknowledge();
         pair.exchange();
         pair.service.acknowledge();
+        // Nothing new, for which the service would draw once more.
+        pair.server.configure(200, 50, 1);
+        pair.exchange();
         pair.server.configure(-7, 2000000000, 1000);
         pair.exchange();
         QCOMPARE(pair.service.eventsOf("configure"),
