@@ -60,88 +60,81 @@ class AXColorDescriptionTest : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void saysThatThereIsNoColor();
-    void firstNameComesLater();
-    void nextViewIsNamedAtOnce();
-    void laterColorReplacesTheSubscription();
-    void endedViewStoresNothing();
-    void flagIsSetOnTheMainQueue();
+    void saysThatThereIsNoColor()
+    {
+        Stage stage;
+        const auto view = stage.view();
+        QCOMPARE(view->evaluate(std::nullopt), std::string("No color selected"));
+        QCOMPARE(stage.background.size(), std::size_t(0));
+        view->evaluate(red);
+        view->evaluate(std::nullopt);
+        stage.deliver();
+        QCOMPARE(stage.changes, 0);
+        stage.readiness.becomeReady();
+        QCOMPARE(view->evaluate(std::nullopt), std::string("No color selected"));
+    }
+
+    void firstNameComesLater()
+    {
+        Stage stage;
+        const auto view = stage.view();
+        QCOMPARE(view->evaluate(red), std::string());
+        stage.deliver();
+        QCOMPARE(stage.changes, 1);
+        QCOMPARE(view->published(), std::string("bright red"));
+        QCOMPARE(view->evaluate(red), std::string("bright red"));
+        QCOMPARE(stage.background.size(), std::size_t(0));
+    }
+
+    void nextViewIsNamedAtOnce()
+    {
+        Stage stage;
+        const auto first = stage.view();
+        first->evaluate(red);
+        stage.deliver();
+        const auto second = stage.view();
+        QCOMPARE(second->evaluate(blue), std::string("bright blue"));
+        QCOMPARE(second->published(), std::string());
+        QCOMPARE(stage.changes, 1);
+    }
+
+    void laterColorReplacesTheSubscription()
+    {
+        Stage stage;
+        const auto view = stage.view();
+        view->evaluate(red);
+        view->evaluate(blue);
+        stage.deliver();
+        QCOMPARE(stage.changes, 1);
+        QCOMPARE(view->published(), std::string("bright blue"));
+    }
+
+    void endedViewStoresNothing()
+    {
+        Stage stage;
+        auto view = stage.view();
+        view->evaluate(red);
+        stage.background.runAll();
+        view.reset();
+        stage.main.runAll();
+        QCOMPARE(stage.changes, 0);
+        QVERIFY(!stage.readiness.isReady());
+    }
+
+    void flagIsSetOnTheMainQueue()
+    {
+        Stage stage;
+        const auto view = stage.view();
+        view->evaluate(red);
+        std::thread([&stage] { stage.background.runAll(); }).join();
+        QVERIFY(!stage.readiness.isReady());
+        QCOMPARE(view->evaluate(std::nullopt), std::string("No color selected"));
+        view->evaluate(blue);
+        stage.deliver();
+        QVERIFY(stage.readiness.isReady());
+        QVERIFY(!model::ColorNamingReadiness::process().isReady());
+    }
 };
-
-void AXColorDescriptionTest::saysThatThereIsNoColor()
-{
-    Stage stage;
-    const auto view = stage.view();
-    QCOMPARE(view->evaluate(std::nullopt), std::string("No color selected"));
-    QCOMPARE(stage.background.size(), std::size_t(0));
-    view->evaluate(red);
-    view->evaluate(std::nullopt);
-    stage.deliver();
-    QCOMPARE(stage.changes, 0);
-    stage.readiness.becomeReady();
-    QCOMPARE(view->evaluate(std::nullopt), std::string("No color selected"));
-}
-
-void AXColorDescriptionTest::firstNameComesLater()
-{
-    Stage stage;
-    const auto view = stage.view();
-    QCOMPARE(view->evaluate(red), std::string());
-    stage.deliver();
-    QCOMPARE(stage.changes, 1);
-    QCOMPARE(view->published(), std::string("bright red"));
-    QCOMPARE(view->evaluate(red), std::string("bright red"));
-    QCOMPARE(stage.background.size(), std::size_t(0));
-}
-
-void AXColorDescriptionTest::nextViewIsNamedAtOnce()
-{
-    Stage stage;
-    const auto first = stage.view();
-    first->evaluate(red);
-    stage.deliver();
-    const auto second = stage.view();
-    QCOMPARE(second->evaluate(blue), std::string("bright blue"));
-    QCOMPARE(second->published(), std::string());
-    QCOMPARE(stage.changes, 1);
-}
-
-void AXColorDescriptionTest::laterColorReplacesTheSubscription()
-{
-    Stage stage;
-    const auto view = stage.view();
-    view->evaluate(red);
-    view->evaluate(blue);
-    stage.deliver();
-    QCOMPARE(stage.changes, 1);
-    QCOMPARE(view->published(), std::string("bright blue"));
-}
-
-void AXColorDescriptionTest::endedViewStoresNothing()
-{
-    Stage stage;
-    auto view = stage.view();
-    view->evaluate(red);
-    stage.background.runAll();
-    view.reset();
-    stage.main.runAll();
-    QCOMPARE(stage.changes, 0);
-    QVERIFY(!stage.readiness.isReady());
-}
-
-void AXColorDescriptionTest::flagIsSetOnTheMainQueue()
-{
-    Stage stage;
-    const auto view = stage.view();
-    view->evaluate(red);
-    std::thread([&stage] { stage.background.runAll(); }).join();
-    QVERIFY(!stage.readiness.isReady());
-    QCOMPARE(view->evaluate(std::nullopt), std::string("No color selected"));
-    view->evaluate(blue);
-    stage.deliver();
-    QVERIFY(stage.readiness.isReady());
-    QVERIFY(!model::ColorNamingReadiness::process().isReady());
-}
 
 QTEST_APPLESS_MAIN(AXColorDescriptionTest)
 #include "tst_axcolordescription.moc"

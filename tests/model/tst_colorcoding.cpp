@@ -9,7 +9,6 @@
 using namespace favrin::model;
 using Space = SomeColor::ColorSpace;
 
-Q_DECLARE_METATYPE(CodingError)
 
 namespace {
 
