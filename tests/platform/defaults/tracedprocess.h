@@ -1,7 +1,6 @@
 #pragma once
 
 #include <fcntl.h>
-#include <sys/mman.h>
 #include <sys/ptrace.h>
 #include <sys/syscall.h>
 #include <sys/uio.h>
@@ -12,7 +11,6 @@
 #include <atomic>
 #include <csignal>
 #include <functional>
-#include <new>
 
 /** What is done to a process, counted in those of its system calls that may fail. */
 struct Fault
@@ -170,23 +168,4 @@ private:
     pid_t m_child = -1;
     int m_calls = 0;
     bool m_isKilled = false;
-};
-
-/** One object in memory that a process shares with its children. */
-template<class Type>
-class SharedObject
-{
-public:
-    SharedObject()
-        : m_object(new (::mmap(nullptr, sizeof(Type), PROT_READ | PROT_WRITE, MAP_SHARED | MAP_ANONYMOUS, -1, 0)) Type)
-    {
-    }
-    ~SharedObject() { ::munmap(static_cast<void *>(m_object), sizeof(Type)); }
-    SharedObject(const SharedObject &) = delete;
-    SharedObject &operator=(const SharedObject &) = delete;
-    Type *operator->() const { return m_object; }
-    Type &operator*() const { return *m_object; }
-
-private:
-    Type *m_object;
 };

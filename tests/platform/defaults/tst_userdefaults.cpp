@@ -1,6 +1,8 @@
 #include "platform/defaults/defaultslocation.h"
 #include "platform/defaults/userdefaults.h"
 
+#include "../../shared/table.h"
+
 #include <QDir>
 #include <QLoggingCategory>
 #include <QTemporaryDir>
@@ -15,6 +17,7 @@
 #include <fstream>
 
 using namespace favrin::platform;
+using namespace Qt::StringLiterals;
 namespace fs = std::filesystem;
 
 namespace {
@@ -51,7 +54,18 @@ QByteArray goodFile(const fs::path &path)
 QStringList setAside(const fs::path &path)
 {
     const QDir folder(QString::fromStdString(path.parent_path().string()));
-    return folder.entryList({QStringLiteral("*.damaged-*")}, QDir::AllEntries | QDir::System | QDir::Hidden);
+    return folder.entryList({u"*.damaged-*"_s}, QDir::AllEntries | QDir::System | QDir::Hidden);
+}
+
+/** What is said to a save for which there is no more than @p limit of @p resource. */
+bool setWhileLimited(UserDefaults &defaults, int resource, rlim_t limit, const DefaultsValue &value)
+{
+    rlimit previous = {};
+    bool isLimited = ::getrlimit(resource, &previous) == 0;
+    const rlimit less = {limit, previous.rlim_max};
+    isLimited &= ::setrlimit(resource, &less) == 0;
+    const bool isSet = defaults.set("key", value);
+    return ::setrlimit(resource, &previous) != 0 || !isLimited || isSet;
 }
 
 /** A value as a test datum: the recursive variant itself has no metatype. */
@@ -70,9 +84,6 @@ Sample nested(int depth)
 
 } // namespace
 
-Q_DECLARE_METATYPE(Sample)
-Q_DECLARE_METATYPE(Prepare)
-
 /** What the store keeps, and what becomes of it when the file is not as it should be. */
 class UserDefaultsTest : public QObject
 {
@@ -81,27 +92,27 @@ class UserDefaultsTest : public QObject
 private Q_SLOTS:
     void init()
     {
-        QLoggingCategory::setFilterRules(QStringLiteral("*.UserDefaults.warning=false"));
+        QLoggingCategory::setFilterRules(u"*.UserDefaults.warning=false"_s);
         m_folder = std::make_unique<QTemporaryDir>();
         m_file = fs::path(m_folder->path().toStdString()) / "a" / "b" / "defaults.sqlite";
     }
 
     void valuesComeBackFromTheDisk_data()
     {
-        QTest::addColumn<Sample>("sample");
-        QTest::addRow("bytes") << Sample{DefaultsValue(Bytes{0, 255, 0})};
-        QTest::addRow("no bytes") << Sample{DefaultsValue(Bytes{})};
-        QTest::addRow("text") << Sample{DefaultsValue(std::string("Grid \xC3\xA9\0 end", 11))};
-        QTest::addRow("no text") << Sample{DefaultsValue(std::string())};
-        QTest::addRow("array") << Sample{
-            DefaultsValue(DefaultsArray{Bytes{1}, std::string("x"), DefaultsArray{Bytes{}}})};
-        QTest::addRow("empty array") << Sample{DefaultsValue(DefaultsArray{})};
-        QTest::addRow("deep") << nested(15);
-        QTest::addRow("large") << Sample{DefaultsValue(Bytes(4 << 20, 7))};
+        addRows<Sample>({
+            {"bytes", {DefaultsValue(Bytes{0, 255, 0})}},
+            {"no bytes", {DefaultsValue(Bytes{})}},
+            {"text", {DefaultsValue(std::string("Grid \xC3\xA9\0 end", 11))}},
+            {"no text", {DefaultsValue(std::string())}},
+            {"array", {DefaultsValue(DefaultsArray{Bytes{1}, std::string("x"), DefaultsArray{Bytes{}}})}},
+            {"empty array", {DefaultsValue(DefaultsArray{})}},
+            {"deep", nested(15)},
+            {"large", {DefaultsValue(Bytes(4 << 20, 7))}},
+        });
     }
     void valuesComeBackFromTheDisk()
     {
-        QFETCH(const Sample, sample);
+        const auto [sample] = row<Sample>();
         const auto &value = sample.value;
         QVERIFY(UserDefaults(m_file).set("key", value));
         UserDefaults defaults(m_file);
@@ -116,16 +127,15 @@ private Q_SLOTS:
 
     void tooMuchIsRefusedAndChangesNothing_data()
     {
-        QTest::addColumn<QByteArray>("key");
-        QTest::addColumn<Sample>("sample");
-        QTest::addRow("long key") << QByteArray(1025, 'k') << Sample{DefaultsValue(std::string("x"))};
-        QTest::addRow("large value") << QByteArray("key") << Sample{DefaultsValue(Bytes((4 << 20) + 1, 7))};
-        QTest::addRow("too deep") << QByteArray("key") << nested(16);
+        addRows<QByteArray, Sample>({
+            {"long key", QByteArray(1025, 'k'), {DefaultsValue(std::string("x"))}},
+            {"large value", "key", {DefaultsValue(Bytes((4 << 20) + 1, 7))}},
+            {"too deep", "key", nested(16)},
+        });
     }
     void tooMuchIsRefusedAndChangesNothing()
     {
-        QFETCH(const QByteArray, key);
-        QFETCH(const Sample, sample);
+        const auto [key, sample] = row<QByteArray, Sample>();
         const auto &value = sample.value;
         goodFile(m_file);
         UserDefaults defaults(m_file);
@@ -193,7 +203,6 @@ private Q_SLOTS:
 
     void aDamagedFileIsSetAsideWhole_data()
     {
-        QTest::addColumn<Prepare>("prepare");
         const auto content = [](const QByteArray &bytes) {
             return Prepare([bytes](const fs::path &path) { writeContent(path, bytes); });
         };
@@ -204,42 +213,47 @@ private Q_SLOTS:
                 writeContent(path, bytes);
             });
         };
-        const auto sql = [](const char *text) { return Prepare([text](const fs::path &path) { runSql(path, text); }); };
-        QTest::addRow("one byte") << content("x");
-        QTest::addRow("text") << content(QByteArray(5000, 'a'));
-        QTest::addRow("zeroes") << content(QByteArray(8192, '\0'));
-        QTest::addRow("only the magic word") << content(QByteArray("SQLite format 3\0", 16));
-        QTest::addRow("ini file") << content("[General]\nFavoriteColors=@ByteArray([])\n");
-        QTest::addRow("cut in a page") << changed([](QByteArray &bytes) { bytes.truncate(bytes.size() - 1); });
-        QTest::addRow("cut at a page") << changed([](QByteArray &bytes) { bytes.truncate(4096); });
-        QTest::addRow("page size") << changed([](QByteArray &bytes) { bytes[16] = 3; });
-        QTest::addRow("only readable format") << changed([](QByteArray &bytes) { bytes[18] = 9; });
-        QTest::addRow("future format") << changed([](QByteArray &bytes) { bytes[19] = 9; });
-        QTest::addRow("table root gone") << changed(
-            [](QByteArray &bytes) { bytes.replace(4096, 4096, QByteArray(4096, 'x')); });
-        QTest::addRow("schema text") << changed([](QByteArray &bytes) { bytes.replace("CREATE", "CR3ATE"); });
-        QTest::addRow("other table") << sql("CREATE TABLE other(a)");
-        QTest::addRow("other columns") << sql("CREATE TABLE defaults(a, b)");
-        QTest::addRow("no unique key") << sql("CREATE TABLE defaults(key, type, value)");
-        QTest::addRow("a view") << sql("CREATE TABLE t(key, type, value); CREATE VIEW defaults AS SELECT * FROM t");
-        QTest::addRow("refuses our rows")
-            << sql("CREATE TABLE defaults(key TEXT PRIMARY KEY, type INTEGER CHECK(type > 99), value BLOB)");
-        QTest::addRow("huge") << Prepare([](const fs::path &path) {
-            writeContent(path, "x");
-            fs::resize_file(path, 40 << 20);
-        });
-        QTest::addRow("folder") << Prepare([](const fs::path &path) { fs::create_directory(path); });
-        QTest::addRow("pipe") << Prepare([](const fs::path &path) { ::mkfifo(path.c_str(), 0600); });
-        QTest::addRow("link to nothing") << Prepare([](const fs::path &path) { fs::create_symlink("nowhere", path); });
-        QTest::addRow("link to itself") << Prepare([](const fs::path &path) { fs::create_symlink(path, path); });
-        QTest::addRow("pipe as its log") << Prepare([](const fs::path &path) {
-            goodFile(path);
-            ::mkfifo((path.string() + "-wal").c_str(), 0600);
+        const auto sql = [](const char *text) -> Prepare {
+            return [text](const fs::path &path) { runSql(path, text); };
+        };
+        addRows<Prepare>({
+            {"one byte", content("x")},
+            {"text", content(QByteArray(5000, 'a'))},
+            {"zeroes", content(QByteArray(8192, '\0'))},
+            {"only the magic word", content(QByteArray("SQLite format 3\0", 16))},
+            {"ini file", content("[General]\nFavoriteColors=@ByteArray([])\n")},
+            {"cut in a page", changed([](QByteArray &bytes) { bytes.truncate(bytes.size() - 1); })},
+            {"cut at a page", changed([](QByteArray &bytes) { bytes.truncate(4096); })},
+            {"page size", changed([](QByteArray &bytes) { bytes[16] = 3; })},
+            {"only readable format", changed([](QByteArray &bytes) { bytes[18] = 9; })},
+            {"future format", changed([](QByteArray &bytes) { bytes[19] = 9; })},
+            {"table root gone", changed([](QByteArray &bytes) { bytes.replace(4096, 4096, QByteArray(4096, 'x')); })},
+            {"schema text", changed([](QByteArray &bytes) { bytes.replace("CREATE", "CR3ATE"); })},
+            {"other table", sql("CREATE TABLE other(a)")},
+            {"other columns", sql("CREATE TABLE defaults(a, b)")},
+            {"no unique key", sql("CREATE TABLE defaults(key, type, value)")},
+            {"a view", sql("CREATE TABLE t(key, type, value); CREATE VIEW defaults AS SELECT * FROM t")},
+            {"refuses our rows",
+             sql("CREATE TABLE defaults(key TEXT PRIMARY KEY, type INTEGER CHECK(type > 99), value BLOB)")},
+            {"huge",
+             [](const fs::path &path) {
+                 writeContent(path, "x");
+                 fs::resize_file(path, 40 << 20);
+             }},
+            {"folder", [](const fs::path &path) { fs::create_directory(path); }},
+            {"pipe", [](const fs::path &path) { ::mkfifo(path.c_str(), 0600); }},
+            {"link to nothing", [](const fs::path &path) { fs::create_symlink("nowhere", path); }},
+            {"link to itself", [](const fs::path &path) { fs::create_symlink(path, path); }},
+            {"pipe as its log",
+             [](const fs::path &path) {
+                 goodFile(path);
+                 ::mkfifo((path.string() + "-wal").c_str(), 0600);
+             }},
         });
     }
     void aDamagedFileIsSetAsideWhole()
     {
-        QFETCH(const Prepare, prepare);
+        const auto [prepare] = row<Prepare>();
         fs::create_directories(m_file.parent_path());
         prepare(m_file);
         const bool plain = fs::is_regular_file(fs::symlink_status(m_file));
@@ -288,17 +302,18 @@ private Q_SLOTS:
 
     void rowsThatAreNotOursReadAsNone_data()
     {
-        QTest::addColumn<QByteArray>("sql");
-        QTest::addRow("unknown type") << QByteArray("UPDATE defaults SET type = 4");
-        QTest::addRow("type as text") << QByteArray("UPDATE defaults SET type = 'two'");
-        QTest::addRow("array cut short") << QByteArray("UPDATE defaults SET type = 3, value = x'01020000'");
-        QTest::addRow("array too long") << QByteArray("UPDATE defaults SET type = 3, value = x'01ffffffff00'");
-        QTest::addRow("unknown element") << QByteArray("UPDATE defaults SET type = 3, value = x'0900000000'");
-        QTest::addRow("larger than any value") << QByteArray("UPDATE defaults SET value = zeroblob(9000000)");
+        addRows<QByteArray>({
+            {"unknown type", "UPDATE defaults SET type = 4"},
+            {"type as text", "UPDATE defaults SET type = 'two'"},
+            {"array cut short", "UPDATE defaults SET type = 3, value = x'01020000'"},
+            {"array too long", "UPDATE defaults SET type = 3, value = x'01ffffffff00'"},
+            {"unknown element", "UPDATE defaults SET type = 3, value = x'0900000000'"},
+            {"larger than any value", "UPDATE defaults SET value = zeroblob(9000000)"},
+        });
     }
     void rowsThatAreNotOursReadAsNone()
     {
-        QFETCH(const QByteArray, sql);
+        const auto [sql] = row<QByteArray>();
         goodFile(m_file);
         runSql(m_file, sql.constData());
         UserDefaults defaults(m_file);
@@ -322,8 +337,8 @@ private Q_SLOTS:
         writeContent(obstacle, "a file where the folder should be");
         UserDefaults defaults(m_file);
         QLoggingCategory::setFilterRules(QString());
-        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("user defaults")));
-        QTest::failOnWarning(QRegularExpression(QStringLiteral(".*")));
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(u"user defaults"_s));
+        QTest::failOnWarning(QRegularExpression(u".*"_s));
         QVERIFY(!defaults.set("first", std::string("1")));
         QVERIFY(!defaults.set("first", std::string("2")));
         QVERIFY(!defaults.update("first", [](const OptionalValue &value) -> OptionalValue {
@@ -340,15 +355,9 @@ private Q_SLOTS:
         goodFile(m_file);
         UserDefaults defaults(m_file);
         QVERIFY(defaults.string("key") == "before");
-        rlimit previous;
-        QCOMPARE(::getrlimit(RLIMIT_FSIZE, &previous), 0);
         const auto handler = std::signal(SIGXFSZ, SIG_IGN);
-        const rlimit full{9000, previous.rlim_max};
-        QCOMPARE(::setrlimit(RLIMIT_FSIZE, &full), 0);
-        const bool written = defaults.set("key", Bytes(100'000, 1));
-        QCOMPARE(::setrlimit(RLIMIT_FSIZE, &previous), 0);
+        QVERIFY(!setWhileLimited(defaults, RLIMIT_FSIZE, 9000, Bytes(100'000, 1)));
         std::signal(SIGXFSZ, handler);
-        QVERIFY(!written);
         QVERIFY(defaults.bytes("key") == Bytes(100'000, 1));
         QVERIFY(UserDefaults(m_file).string("key") == "before");
         QVERIFY(defaults.set("other", std::string("x")));
@@ -357,25 +366,20 @@ private Q_SLOTS:
 
     void aShortageOfDescriptorsPassesWithoutLoss_data()
     {
-        QTest::addColumn<int>("available");
-        QTest::addRow("none") << 0;
-        QTest::addRow("for the file") << 1;
-        QTest::addRow("for its log as well") << 2;
+        addRows<int>({
+            {"none", 0},
+            {"for the file", 1},
+            {"for its log as well", 2},
+        });
     }
     void aShortageOfDescriptorsPassesWithoutLoss()
     {
-        QFETCH(const int, available);
+        const auto [available] = row<int>();
         goodFile(m_file);
         UserDefaults defaults(m_file);
-        rlimit previous;
-        QCOMPARE(::getrlimit(RLIMIT_NOFILE, &previous), 0);
         const int next = ::dup(0);
         ::close(next);
-        const rlimit shortage{rlim_t(next + available), previous.rlim_max};
-        QCOMPARE(::setrlimit(RLIMIT_NOFILE, &shortage), 0);
-        const bool written = defaults.set("key", std::string("after"));
-        QCOMPARE(::setrlimit(RLIMIT_NOFILE, &previous), 0);
-        QVERIFY(!written);
+        QVERIFY(!setWhileLimited(defaults, RLIMIT_NOFILE, rlim_t(next + available), std::string("after")));
         QVERIFY(UserDefaults(m_file).string("key") == "before");
         QVERIFY(defaults.set("other", std::string("x")));
         QVERIFY(UserDefaults(m_file).string("key") == "after");
@@ -394,25 +398,18 @@ private Q_SLOTS:
 
     void standardFile_data()
     {
-        QTest::addColumn<QByteArray>("named");
-        QTest::addColumn<QByteArray>("dataHome");
-        QTest::addColumn<QByteArray>("home");
-        QTest::addColumn<QByteArray>("expected");
         const QByteArray name = "/favrin-color-picker/defaults.sqlite";
-        QTest::addRow("named") << QByteArray("/x/y.db") << QByteArray("/data") << QByteArray("/home/u")
-                               << QByteArray("/x/y.db");
-        QTest::addRow("data home") << QByteArray() << QByteArray("/data") << QByteArray("/home/u") << "/data" + name;
-        QTest::addRow("relative data home")
-            << QByteArray() << QByteArray("data") << QByteArray("/home/u") << "/home/u/.local/share" + name;
-        QTest::addRow("home") << QByteArray() << QByteArray() << QByteArray("/home/u") << "/home/u/.local/share" + name;
-        QTest::addRow("nothing") << QByteArray() << QByteArray() << QByteArray() << QByteArray();
+        addRows<QByteArray, QByteArray, QByteArray, QByteArray>({
+            {"named", "/x/y.db", "/data", "/home/u", "/x/y.db"},
+            {"data home", {}, "/data", "/home/u", "/data" + name},
+            {"relative data home", {}, "data", "/home/u", "/home/u/.local/share" + name},
+            {"home", {}, {}, "/home/u", "/home/u/.local/share" + name},
+            {"nothing", {}, {}, {}, {}},
+        });
     }
     void standardFile()
     {
-        QFETCH(const QByteArray, named);
-        QFETCH(const QByteArray, dataHome);
-        QFETCH(const QByteArray, home);
-        QFETCH(const QByteArray, expected);
+        const auto [named, dataHome, home, expected] = row<QByteArray, QByteArray, QByteArray, QByteArray>();
         const std::array<const char *, 3> names{"FAVRIN_DEFAULTS_FILE", "XDG_DATA_HOME", "HOME"};
         const std::array<QByteArray, 3> previous{qgetenv(names[0]), qgetenv(names[1]), qgetenv(names[2])};
         const std::array<QByteArray, 3> values{named, dataHome, home};

@@ -1,21 +1,24 @@
 #include "platform/defaults/userdefaults.h"
 
 #include "cutdisk.h"
+#include "sharedobject.h"
 
 #include <QLoggingCategory>
 #include <QTemporaryDir>
 #include <QtTest>
 
 #include <fcntl.h>
-#include <sys/mman.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
 #include <atomic>
 #include <csignal>
+#include <fstream>
+#include <functional>
 #include <random>
 
 using namespace favrin::platform;
+using namespace Qt::StringLiterals;
 namespace fs = std::filesystem;
 
 namespace {
@@ -34,28 +37,17 @@ pid_t startChild(Work work)
     return child;
 }
 
+void kill(pid_t child)
+{
+    ::kill(child, SIGKILL);
+    ::waitpid(child, nullptr, 0);
+}
+
 bool endedWell(pid_t child)
 {
     int status = -1;
     return ::waitpid(child, &status, 0) == child && WIFEXITED(status) && WEXITSTATUS(status) == 0;
 }
-
-/** A number that parent and children share. */
-class SharedNumber
-{
-public:
-    SharedNumber()
-        : m_page(::mmap(nullptr, sizeof(std::atomic<int>), PROT_READ | PROT_WRITE, MAP_SHARED | MAP_ANONYMOUS, -1, 0))
-    {
-    }
-    ~SharedNumber() { ::munmap(m_page, sizeof(std::atomic<int>)); }
-    SharedNumber(const SharedNumber &) = delete;
-    SharedNumber &operator=(const SharedNumber &) = delete;
-    std::atomic<int> *operator->() const { return static_cast<std::atomic<int> *>(m_page); }
-
-private:
-    void *m_page;
-};
 
 /** A value whose every byte belongs together: the number, then the number's low byte again and again. */
 std::string numbered(int number)
@@ -65,6 +57,16 @@ std::string numbered(int number)
 
 } // namespace
 
+/** Numbers of saves: acknowledged before the end and until it, and found after it. */
+struct Saves
+{
+    int known = 0;
+    int acknowledged = 0;
+    int stored = 0;
+};
+
+using Number = SharedObject<std::atomic<int>>;
+
 /** What several processes do to one store, and what is left when they die. */
 class UserDefaultsProcessesTest : public QObject
 {
@@ -73,7 +75,7 @@ class UserDefaultsProcessesTest : public QObject
 private Q_SLOTS:
     void init()
     {
-        QLoggingCategory::setFilterRules(QStringLiteral("*.UserDefaults.warning=false"));
+        QLoggingCategory::setFilterRules(u"*.UserDefaults.warning=false"_s);
         m_folder = std::make_unique<QTemporaryDir>();
         m_file = fs::path(m_folder->path().toStdString()) / "defaults.sqlite";
     }
@@ -82,31 +84,12 @@ private Q_SLOTS:
     {
         // A fixed seed: the moments still differ from run to run, the spread does not.
         std::mt19937 random(1);
-        int stored = 0;
-        for (int round = 0; round < 60; ++round) {
-            SharedNumber acknowledged;
-            acknowledged->store(stored);
-            const int first = stored + 1;
-            const pid_t writer = startChild([&] {
-                UserDefaults defaults(m_file);
-                for (int number = first;; ++number) {
-                    if (defaults.set("key", numbered(number)))
-                        acknowledged->store(number);
-                }
-            });
-            QVERIFY(QTest::qWaitFor([&] { return acknowledged->load() >= first; }));
-            ::usleep(random() % 3000);
-            ::kill(writer, SIGKILL);
-            ::waitpid(writer, nullptr, 0);
-
-            UserDefaults defaults(m_file);
-            const auto text = defaults.string("key");
-            QVERIFY(text);
-            stored = QString::fromStdString(text->substr(0, text->find(':'))).toInt();
-            QVERIFY(*text == numbered(stored));
+        Saves saves;
+        for (int round = 0; round < 60 && !QTest::currentTestFailed(); ++round) {
+            saveUntil(
+                m_file, saves, random() % 3000, [] {}, [] {});
             // Nothing that was acknowledged is lost; at most the save in flight is there as well.
-            QVERIFY(stored == acknowledged->load() || stored == acknowledged->load() + 1);
-            QVERIFY(defaults.set("parent", std::to_string(round)));
+            QVERIFY(saves.stored == saves.acknowledged || saves.stored == saves.acknowledged + 1);
         }
         QCOMPARE(std::distance(fs::directory_iterator(m_file.parent_path()), fs::directory_iterator()), 1);
     }
@@ -118,39 +101,17 @@ private Q_SLOTS:
             QSKIP("needs the rights and the programs to make and mount a disk of its own");
         std::mt19937 random(1);
         const auto file = fs::path(disk.folder().toStdString()) / "a" / "defaults.sqlite";
-        int stored = 0;
+        Saves saves;
         bool isSet = false;
         const int asked = qEnvironmentVariableIntValue("FAVRIN_CHAOS_ROUNDS", &isSet);
         const int rounds = isSet ? asked : 8;
-        for (int round = 0; round < rounds; ++round) {
-            SharedNumber acknowledged;
-            acknowledged->store(stored);
-            const int first = stored + 1;
-            const pid_t writer = startChild([&] {
-                UserDefaults defaults(file);
-                for (int number = first;; ++number) {
-                    if (defaults.set("key", numbered(number)))
-                        acknowledged->store(number);
-                }
-            });
-            QVERIFY(QTest::qWaitFor([&] { return acknowledged->load() >= first; }));
-            ::usleep(random() % 5000);
+        for (int round = 0; round < rounds && !QTest::currentTestFailed(); ++round) {
+            saveUntil(
+                file, saves, random() % 5000, [&] { QVERIFY(disk.cut()); }, [&] { QVERIFY(disk.restart()); });
             // What is acknowledged while the power fails may be lost or not; what was before, may not.
-            const int known = acknowledged->load();
-            QVERIFY(disk.cut());
-            ::kill(writer, SIGKILL);
-            ::waitpid(writer, nullptr, 0);
-            QVERIFY(disk.restart());
-
-            UserDefaults defaults(file);
-            const auto text = defaults.string("key");
-            QVERIFY(text);
-            stored = QString::fromStdString(text->substr(0, text->find(':'))).toInt();
-            QVERIFY(*text == numbered(stored));
-            QVERIFY2(stored >= known, qPrintable(QStringLiteral("%1 of %2").arg(stored).arg(known)));
-            QVERIFY(defaults.set("parent", std::to_string(round)));
+            QVERIFY2(saves.stored >= saves.known, qPrintable(u"%1 of %2"_s.arg(saves.stored).arg(saves.known)));
         }
-        qInfo("the power was cut %d times, after %d saves in all", rounds, stored);
+        qInfo("the power was cut %d times, after %d saves in all", rounds, saves.stored);
         for (const auto &entry : fs::directory_iterator(file.parent_path()))
             QVERIFY(entry.path().string().find("damaged") == std::string::npos);
     }
@@ -191,10 +152,7 @@ private Q_SLOTS:
         for (int round = 0; round < 10; ++round) {
             fs::remove_all(m_file.parent_path());
             fs::create_directories(m_file.parent_path());
-            QFile file(QString::fromStdString(m_file.string()));
-            QVERIFY(file.open(QIODevice::WriteOnly));
-            file.write(QByteArray(9000, 'x'));
-            file.close();
+            std::ofstream(m_file) << std::string(9000, 'x');
             std::vector<pid_t> writers;
             for (int index = 0; index < 4; ++index) {
                 writers.push_back(startChild([&] {
@@ -214,7 +172,7 @@ private Q_SLOTS:
     void aProcessThatStopsWhileItWritesDelaysButDoesNotBlock()
     {
         QVERIFY(UserDefaults(m_file).set("key", std::string("before")));
-        SharedNumber inside;
+        const Number inside;
         const pid_t holder = startChild([&] {
             UserDefaults(m_file).update("key", [&](const OptionalValue &value) {
                 inside->store(1);
@@ -228,8 +186,7 @@ private Q_SLOTS:
         QVERIFY(defaults.string("key") == "before");
         QVERIFY(!defaults.set("key", std::string("after")));
         QVERIFY(defaults.string("key") == "after");
-        ::kill(holder, SIGKILL);
-        ::waitpid(holder, nullptr, 0);
+        kill(holder);
         QVERIFY(UserDefaults(m_file).string("key") == "before");
         QVERIFY(defaults.set("key", std::string("after")));
         QVERIFY(UserDefaults(m_file).string("key") == "after");
@@ -237,9 +194,8 @@ private Q_SLOTS:
 
     void aProcessThatStopsWhileItMakesTheIndexDoesNotBlock()
     {
-        const pid_t first = startChild([&] { UserDefaults(m_file).set("key", std::string("before")); });
-        QVERIFY(endedWell(first));
-        SharedNumber inside;
+        QVERIFY(endedWell(startChild([&] { UserDefaults(m_file).set("key", std::string("before")); })));
+        const Number inside;
         const pid_t holder = startChild([&] {
             constexpr off_t lockOfTheMaker = 128;
             const auto index = m_file.string() + "-shm";
@@ -257,13 +213,41 @@ private Q_SLOTS:
         UserDefaults defaults(m_file);
         QVERIFY(!defaults.set("key", std::string("after")));
         QVERIFY(defaults.string("key") == "after");
-        ::kill(holder, SIGKILL);
-        ::waitpid(holder, nullptr, 0);
+        kill(holder);
         QVERIFY(defaults.set("other", std::string("x")));
         QVERIFY(UserDefaults(m_file).string("key") == "after");
     }
 
 private:
+    /** A process that saves one number after the other, until @p cut and its death; @p mend comes before the look. */
+    static void saveUntil(const fs::path &file, Saves &saves, useconds_t delay, const std::function<void()> &cut,
+                          const std::function<void()> &mend)
+    {
+        const Number acknowledged;
+        acknowledged->store(saves.stored);
+        const int first = saves.stored + 1;
+        const pid_t writer = startChild([&] {
+            UserDefaults defaults(file);
+            for (int number = first;; ++number) {
+                if (defaults.set("key", numbered(number)))
+                    acknowledged->store(number);
+            }
+        });
+        QVERIFY(QTest::qWaitFor([&] { return acknowledged->load() >= first; }));
+        ::usleep(delay);
+        saves.known = acknowledged->load();
+        cut();
+        kill(writer);
+        saves.acknowledged = acknowledged->load();
+        mend();
+        UserDefaults defaults(file);
+        const auto text = defaults.string("key");
+        QVERIFY(text);
+        saves.stored = QString::fromStdString(text->substr(0, text->find(':'))).toInt();
+        QVERIFY(*text == numbered(saves.stored));
+        QVERIFY(defaults.set("parent", std::to_string(first)));
+    }
+
     std::unique_ptr<QTemporaryDir> m_folder;
     fs::path m_file;
 };

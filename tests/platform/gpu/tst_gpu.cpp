@@ -7,6 +7,8 @@
 #include "platform/gpu/systemdevice.h"
 #include "platform/gpu/vulkan/vulkaninstance.h"
 
+#include "../../shared/table.h"
+
 #include <QDir>
 #include <QFile>
 #include <QJsonArray>
@@ -18,6 +20,7 @@
 
 using namespace favrin::platform::gpu;
 using vulkan::DeviceChoice;
+using namespace Qt::StringLiterals;
 
 namespace {
 
@@ -92,188 +95,165 @@ class GpuTest : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase();
-    void policyChoosesTheDevice_data();
-    void policyChoosesTheDevice();
-    void hardwareIsPreferred_data();
-    void hardwareIsPreferred();
-    void rectangleCoversPixels_data();
-    void rectangleCoversPixels();
-    void otherTrianglesAreNoRectangle_data();
-    void otherTrianglesAreNoRectangle();
-    void bufferTooShortDrawsNothing();
-    void incompleteDescriptionsMakeNothing();
-    void captureWritesItsFrames();
+    void initTestCase()
+    {
+        setDefaultLibraryContents({.spirvFolder = {},
+                                   .vertexFunctions = {{"passOn", passOn}},
+                                   .fragmentFunctions = {{"paintRed", paintRed}}});
+    }
+
+    void policyChoosesTheDevice_data()
+    {
+        addRows<QByteArray, bool, DevicePolicy>({
+            {"no GPU", {}, false, DevicePolicy::ProcessorOnly},
+            {"a GPU", {}, true, DevicePolicy::Hardware},
+            {"a GPU not to be used", "processor", true, DevicePolicy::ProcessorOnly},
+            {"a GPU that is not shown", "hardware", false, DevicePolicy::Hardware},
+            {"any driver", "vulkan", false, DevicePolicy::AnyVulkanDevice},
+            {"unknown setting", "Vulkan2", false, DevicePolicy::ProcessorOnly},
+        });
+    }
+    void policyChoosesTheDevice()
+    {
+        const auto [setting, systemShowsGpu, policy] = row<QByteArray, bool, DevicePolicy>();
+        QCOMPARE(devicePolicy(setting, systemShowsGpu), policy);
+    }
+
+    void hardwareIsPreferred_data()
+    {
+        const auto hardware = DeviceChoice::HardwareOnly;
+        const auto any = DeviceChoice::AnyDevice;
+        addRows<std::vector<Type>, DeviceChoice, int>({
+            {"none", {}, any, -1},
+            {"the processor is no hardware", {Type::eCpu}, hardware, -1},
+            {"the processor will do", {Type::eCpu}, any, 0},
+            {"hardware before the processor", {Type::eCpu, Type::eVirtualGpu}, any, 1},
+            {"its own before shared", {Type::eIntegratedGpu, Type::eDiscreteGpu}, hardware, 1},
+            {"the first of equals", {Type::eDiscreteGpu, Type::eDiscreteGpu}, hardware, 0},
+            {"what it is not told", {Type::eOther}, hardware, -1},
+        });
+    }
+    void hardwareIsPreferred()
+    {
+        const auto [types, choice, index] = row<std::vector<Type>, DeviceChoice, int>();
+        const auto chosen = vulkan::preferredDevice(types, choice);
+        QCOMPARE(chosen ? static_cast<int>(*chosen) : -1, index);
+    }
+
+    void rectangleCoversPixels_data()
+    {
+        addRows<QRectF, QRect>({
+            // Left and bottom, then width and height.
+            {"everything", {-1.0, -1.0, 2.0, 2.0}, {0, 0, 8, 4}},
+            {"top left quarter", {-1.0, 0.0, 1.0, 1.0}, {0, 0, 4, 2}},
+            {"reaches beyond", {-3.0, -3.0, 6.0, 6.0}, {0, 0, 8, 4}},
+            {"half a pixel belongs to whom its middle does", {-0.875, -1.0, 0.25, 2.0}, {0, 0, 1, 4}},
+            {"between two middles", {-0.84, -1.0, 0.1, 2.0}, {1, 0, 0, 4}},
+        });
+    }
+    void rectangleCoversPixels()
+    {
+        const auto [clip, pixels] = row<QRectF, QRect>();
+        const auto corners = rectangle(static_cast<float>(clip.left()), static_cast<float>(clip.top()),
+                                       static_cast<float>(clip.right()), static_cast<float>(clip.bottom()));
+        std::array<ShadedVertex, 6> vertices;
+        for (std::size_t i = 0; i < vertices.size(); ++i)
+            vertices[i] = passOn(corners.data() + 2 * i);
+        const auto raster = cpu::rasterRectangle(vertices, {8, 4});
+        QVERIFY(raster);
+        QCOMPARE(raster->pixels, pixels);
+        // What is passed on is the place in clip space here: of the middles of the pixels.
+        for (int x = 0; x < pixels.width(); ++x)
+            QCOMPARE(raster->columns[static_cast<std::size_t>(x)],
+                     static_cast<float>((pixels.x() + x + 0.5) / 4.0 - 1.0));
+        for (int y = 0; y < pixels.height(); ++y)
+            QCOMPARE(raster->rows[static_cast<std::size_t>(y)], static_cast<float>(1.0 - (pixels.y() + y + 0.5) / 2.0));
+
+        // Those are painted, and all others cleared.
+        const QImage picture = drawn(m_device, corners, {8, 4});
+        QCOMPARE(redPixels(picture), pixels.width() * pixels.height());
+        QCOMPARE(picture.pixel(7, 3), pixels.contains(7, 3) ? red : qRgba(0, 0, 0, 0));
+    }
+
+    void otherTrianglesAreNoRectangle_data()
+    {
+        addRows<std::vector<float>>({
+            {"the same half twice", {-1, 1, -1, -1, 1, -1, -1, 1, -1, -1, 1, -1}},
+            {"halves that overlap", {-1, 1, -1, -1, 1, -1, -1, 1, -1, -1, 1, 1}},
+            {"a corner is off", {-1, 1, -1, -1, 1, -1, -1, 1, 0.5F, 1, 1, -1}},
+            {"a line", {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
+        });
+    }
+    void otherTrianglesAreNoRectangle()
+    {
+        const auto [corners] = row<std::vector<float>>();
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(u"upright rectangles only"_s));
+        const QImage picture = drawn(m_device, corners, {8, 4});
+        QCOMPARE(picture.size(), QSize(8, 4));
+        QCOMPARE(redPixels(picture), 0);
+    }
+
+    void bufferTooShortDrawsNothing()
+    {
+        QTest::ignoreMessage(QtWarningMsg, QRegularExpression(u"upright rectangles only"_s));
+        const auto corners = rectangle(-1.0F, -1.0F, 1.0F, 1.0F);
+        RenderPass pass;
+        pass.descriptor.colorAttachments[0].texture = m_device->makeTexture({8, 4}, PixelFormat::BGRA8Unorm);
+        pass.draws = {{.pipelineState = m_device->makeRenderPipelineState(redPipeline(*m_device), nullptr),
+                       .vertexBuffer = m_device->makeBuffer(std::as_bytes(std::span(corners))),
+                       .vertexBufferOffset = sizeof(float),
+                       .vertexCount = 6}};
+        m_device->submit({pass}, [](CommandBufferStatus) {});
+        QCOMPARE(redPixels(pass.descriptor.colorAttachments[0].texture->takeImage()), 0);
+    }
+
+    void incompleteDescriptionsMakeNothing()
+    {
+        QVERIFY(!m_device->makeTexture({0, 4}, PixelFormat::BGRA8Unorm));
+        QVERIFY(!m_device->makeTexture({4, 4}, PixelFormat::Invalid));
+        RenderPipelineDescriptor pipeline = redPipeline(*m_device);
+        QVERIFY(m_device->makeRenderPipelineState(pipeline, nullptr));
+        pipeline.fragmentFunction = pipeline.vertexFunction;
+        QVERIFY(!m_device->makeRenderPipelineState(pipeline, nullptr));
+        pipeline.fragmentFunction = m_device->makeDefaultLibrary()->makeFunction("noShader");
+        std::string error;
+        QVERIFY(!m_device->makeRenderPipelineState(pipeline, &error) && !error.empty());
+        pipeline = redPipeline(*m_device);
+        pipeline.colorAttachments[0].pixelFormat = PixelFormat::Invalid;
+        QVERIFY(!m_device->makeRenderPipelineState(pipeline, nullptr));
+    }
+
+    void captureWritesItsFrames()
+    {
+        const QTemporaryDir folder;
+        const auto corners = rectangle(-1.0F, 0.0F, 0.0F, 1.0F);
+        auto &manager = CaptureManager::shared();
+        QVERIFY(!manager.startCapture({nullptr, folder.path()}));
+        QVERIFY(manager.startCapture({m_device, folder.path()}));
+        QVERIFY(!manager.startCapture({m_device, folder.path()}));
+        drawn(std::make_shared<cpu::CpuDevice>(), corners, {8, 4});
+        const QImage first = drawn(m_device, corners, {8, 4});
+        drawn(m_device, corners, {6, 2});
+        manager.stopCapture();
+        drawn(m_device, corners, {8, 4});
+
+        QCOMPARE(QDir(folder.path()).entryList(QDir::Files, QDir::Name),
+                 (QStringList{u"frame-1.json"_s, u"frame-1.png"_s, u"frame-2.json"_s, u"frame-2.png"_s}));
+        const QImage picture = QImage(folder.filePath(u"frame-1.png"_s)).convertToFormat(first.format());
+        QCOMPARE(picture, first);
+        QFile file(folder.filePath(u"frame-2.json"_s));
+        QVERIFY(file.open(QIODevice::ReadOnly));
+        const QJsonObject pass =
+            QJsonDocument::fromJson(file.readAll())[u"renderPasses"_s].toArray().first().toObject();
+        QCOMPARE(pass[u"width"_s].toInt(), 6);
+        const QJsonObject draw = pass[u"draws"_s].toArray().first().toObject();
+        QCOMPARE(draw[u"vertexCount"_s].toInt(), 6);
+        QCOMPARE(draw[u"vertexBufferLength"_s].toInt(), 48);
+    }
 
 private:
     std::shared_ptr<Device> m_device = std::make_shared<cpu::CpuDevice>();
 };
-
-void GpuTest::initTestCase()
-{
-    setDefaultLibraryContents(
-        {.spirvFolder = {}, .vertexFunctions = {{"passOn", passOn}}, .fragmentFunctions = {{"paintRed", paintRed}}});
-}
-
-void GpuTest::policyChoosesTheDevice_data()
-{
-    QTest::addColumn<QByteArray>("setting");
-    QTest::addColumn<bool>("systemShowsGpu");
-    QTest::addColumn<DevicePolicy>("policy");
-    QTest::newRow("no GPU") << QByteArray() << false << DevicePolicy::ProcessorOnly;
-    QTest::newRow("a GPU") << QByteArray() << true << DevicePolicy::Hardware;
-    QTest::newRow("a GPU not to be used") << QByteArray("processor") << true << DevicePolicy::ProcessorOnly;
-    QTest::newRow("a GPU that is not shown") << QByteArray("hardware") << false << DevicePolicy::Hardware;
-    QTest::newRow("any driver") << QByteArray("vulkan") << false << DevicePolicy::AnyVulkanDevice;
-    QTest::newRow("unknown setting") << QByteArray("Vulkan2") << false << DevicePolicy::ProcessorOnly;
-}
-
-void GpuTest::policyChoosesTheDevice()
-{
-    QFETCH(QByteArray, setting);
-    QFETCH(bool, systemShowsGpu);
-    QFETCH(DevicePolicy, policy);
-    QCOMPARE(devicePolicy(setting, systemShowsGpu), policy);
-}
-
-void GpuTest::hardwareIsPreferred_data()
-{
-    QTest::addColumn<std::vector<Type>>("types");
-    QTest::addColumn<DeviceChoice>("choice");
-    QTest::addColumn<int>("index");
-    const auto hardware = DeviceChoice::HardwareOnly;
-    const auto any = DeviceChoice::AnyDevice;
-    QTest::newRow("none") << std::vector<Type>() << any << -1;
-    QTest::newRow("the processor is no hardware") << std::vector{Type::eCpu} << hardware << -1;
-    QTest::newRow("the processor will do") << std::vector{Type::eCpu} << any << 0;
-    QTest::newRow("hardware before the processor") << std::vector{Type::eCpu, Type::eVirtualGpu} << any << 1;
-    QTest::newRow("its own before shared") << std::vector{Type::eIntegratedGpu, Type::eDiscreteGpu} << hardware << 1;
-    QTest::newRow("the first of equals") << std::vector{Type::eDiscreteGpu, Type::eDiscreteGpu} << hardware << 0;
-    QTest::newRow("what it is not told") << std::vector{Type::eOther} << hardware << -1;
-}
-
-void GpuTest::hardwareIsPreferred()
-{
-    QFETCH(std::vector<Type>, types);
-    QFETCH(DeviceChoice, choice);
-    QFETCH(int, index);
-    const auto chosen = vulkan::preferredDevice(types, choice);
-    QCOMPARE(chosen ? static_cast<int>(*chosen) : -1, index);
-}
-
-void GpuTest::rectangleCoversPixels_data()
-{
-    QTest::addColumn<QRectF>("clip");
-    QTest::addColumn<QRect>("pixels");
-    // Left and bottom, then width and height.
-    QTest::newRow("everything") << QRectF(-1.0, -1.0, 2.0, 2.0) << QRect(0, 0, 8, 4);
-    QTest::newRow("top left quarter") << QRectF(-1.0, 0.0, 1.0, 1.0) << QRect(0, 0, 4, 2);
-    QTest::newRow("reaches beyond") << QRectF(-3.0, -3.0, 6.0, 6.0) << QRect(0, 0, 8, 4);
-    QTest::newRow("half a pixel belongs to whom its middle does")
-        << QRectF(-0.875, -1.0, 0.25, 2.0) << QRect(0, 0, 1, 4);
-    QTest::newRow("between two middles") << QRectF(-0.84, -1.0, 0.1, 2.0) << QRect(1, 0, 0, 4);
-}
-
-void GpuTest::rectangleCoversPixels()
-{
-    QFETCH(QRectF, clip);
-    QFETCH(QRect, pixels);
-    const auto corners = rectangle(static_cast<float>(clip.left()), static_cast<float>(clip.top()),
-                                   static_cast<float>(clip.right()), static_cast<float>(clip.bottom()));
-    std::array<ShadedVertex, 6> vertices;
-    for (std::size_t i = 0; i < vertices.size(); ++i)
-        vertices[i] = passOn(corners.data() + 2 * i);
-    const auto raster = cpu::rasterRectangle(vertices, {8, 4});
-    QVERIFY(raster);
-    QCOMPARE(raster->pixels, pixels);
-    // What is passed on is the place in clip space here: of the middles of the pixels.
-    for (int x = 0; x < pixels.width(); ++x)
-        QCOMPARE(raster->columns[static_cast<std::size_t>(x)], static_cast<float>((pixels.x() + x + 0.5) / 4.0 - 1.0));
-    for (int y = 0; y < pixels.height(); ++y)
-        QCOMPARE(raster->rows[static_cast<std::size_t>(y)], static_cast<float>(1.0 - (pixels.y() + y + 0.5) / 2.0));
-
-    // Those are painted, and all others cleared.
-    const QImage picture = drawn(m_device, corners, {8, 4});
-    QCOMPARE(redPixels(picture), pixels.width() * pixels.height());
-    QCOMPARE(picture.pixel(7, 3), pixels.contains(7, 3) ? red : qRgba(0, 0, 0, 0));
-}
-
-void GpuTest::otherTrianglesAreNoRectangle_data()
-{
-    QTest::addColumn<std::vector<float>>("corners");
-    QTest::newRow("the same half twice") << std::vector<float>{-1, 1, -1, -1, 1, -1, -1, 1, -1, -1, 1, -1};
-    QTest::newRow("halves that overlap") << std::vector<float>{-1, 1, -1, -1, 1, -1, -1, 1, -1, -1, 1, 1};
-    QTest::newRow("a corner is off") << std::vector<float>{-1, 1, -1, -1, 1, -1, -1, 1, 0.5F, 1, 1, -1};
-    QTest::newRow("a line") << std::vector<float>{0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0};
-}
-
-void GpuTest::otherTrianglesAreNoRectangle()
-{
-    QFETCH(std::vector<float>, corners);
-    QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("upright rectangles only")));
-    const QImage picture = drawn(m_device, corners, {8, 4});
-    QCOMPARE(picture.size(), QSize(8, 4));
-    QCOMPARE(redPixels(picture), 0);
-}
-
-void GpuTest::bufferTooShortDrawsNothing()
-{
-    QTest::ignoreMessage(QtWarningMsg, QRegularExpression(QStringLiteral("upright rectangles only")));
-    const auto corners = rectangle(-1.0F, -1.0F, 1.0F, 1.0F);
-    RenderPass pass;
-    pass.descriptor.colorAttachments[0].texture = m_device->makeTexture({8, 4}, PixelFormat::BGRA8Unorm);
-    pass.draws = {{.pipelineState = m_device->makeRenderPipelineState(redPipeline(*m_device), nullptr),
-                   .vertexBuffer = m_device->makeBuffer(std::as_bytes(std::span(corners))),
-                   .vertexBufferOffset = sizeof(float),
-                   .vertexCount = 6}};
-    m_device->submit({pass}, [](CommandBufferStatus) {});
-    QCOMPARE(redPixels(pass.descriptor.colorAttachments[0].texture->takeImage()), 0);
-}
-
-void GpuTest::incompleteDescriptionsMakeNothing()
-{
-    QVERIFY(!m_device->makeTexture({0, 4}, PixelFormat::BGRA8Unorm));
-    QVERIFY(!m_device->makeTexture({4, 4}, PixelFormat::Invalid));
-    RenderPipelineDescriptor pipeline = redPipeline(*m_device);
-    QVERIFY(m_device->makeRenderPipelineState(pipeline, nullptr));
-    pipeline.fragmentFunction = pipeline.vertexFunction;
-    QVERIFY(!m_device->makeRenderPipelineState(pipeline, nullptr));
-    pipeline.fragmentFunction = m_device->makeDefaultLibrary()->makeFunction("noShader");
-    std::string error;
-    QVERIFY(!m_device->makeRenderPipelineState(pipeline, &error) && !error.empty());
-    pipeline = redPipeline(*m_device);
-    pipeline.colorAttachments[0].pixelFormat = PixelFormat::Invalid;
-    QVERIFY(!m_device->makeRenderPipelineState(pipeline, nullptr));
-}
-
-void GpuTest::captureWritesItsFrames()
-{
-    const QTemporaryDir folder;
-    const auto corners = rectangle(-1.0F, 0.0F, 0.0F, 1.0F);
-    auto &manager = CaptureManager::shared();
-    QVERIFY(!manager.startCapture({nullptr, folder.path()}));
-    QVERIFY(manager.startCapture({m_device, folder.path()}));
-    QVERIFY(!manager.startCapture({m_device, folder.path()}));
-    drawn(std::make_shared<cpu::CpuDevice>(), corners, {8, 4});
-    const QImage first = drawn(m_device, corners, {8, 4});
-    drawn(m_device, corners, {6, 2});
-    manager.stopCapture();
-    drawn(m_device, corners, {8, 4});
-
-    QCOMPARE(QDir(folder.path()).entryList(QDir::Files, QDir::Name),
-             (QStringList{QStringLiteral("frame-1.json"), QStringLiteral("frame-1.png"), QStringLiteral("frame-2.json"),
-                          QStringLiteral("frame-2.png")}));
-    const QImage picture = QImage(folder.filePath(QStringLiteral("frame-1.png"))).convertToFormat(first.format());
-    QCOMPARE(picture, first);
-    QFile file(folder.filePath(QStringLiteral("frame-2.json")));
-    QVERIFY(file.open(QIODevice::ReadOnly));
-    const QJsonObject pass =
-        QJsonDocument::fromJson(file.readAll())[QStringLiteral("renderPasses")].toArray().first().toObject();
-    QCOMPARE(pass[QStringLiteral("width")].toInt(), 6);
-    const QJsonObject draw = pass[QStringLiteral("draws")].toArray().first().toObject();
-    QCOMPARE(draw[QStringLiteral("vertexCount")].toInt(), 6);
-    QCOMPARE(draw[QStringLiteral("vertexBufferLength")].toInt(), 48);
-}
 
 QTEST_GUILESS_MAIN(GpuTest)
 #include "tst_gpu.moc"

@@ -1,9 +1,12 @@
 #include "platform/log/log.h"
 
+#include "../../shared/table.h"
+
 #include <QLoggingCategory>
 #include <QtTest>
 
 using favrin::platform::Log;
+using namespace Qt::StringLiterals;
 
 /** Where entries go, and which are written. */
 class LogTest : public QObject
@@ -15,7 +18,7 @@ private Q_SLOTS:
     {
         s_entries.clear();
         m_previous = qInstallMessageHandler([](QtMsgType type, const QMessageLogContext &context, const QString &text) {
-            s_entries << QStringLiteral("%1|%2|%3").arg(QString::fromLatin1(context.category)).arg(type).arg(text);
+            s_entries << u"%1|%2|%3"_s.arg(QString::fromLatin1(context.category)).arg(type).arg(text);
         });
     }
     void cleanup()
@@ -26,19 +29,18 @@ private Q_SLOTS:
 
     void entriesObeyTheFilterRules_data()
     {
-        QTest::addColumn<QString>("rules");
-        QTest::addColumn<QStringList>("written");
-        const QString debug = QStringLiteral("sub.cat|0|d \"é\"");
-        const QString warning = QStringLiteral("sub.cat|1|w");
-        const QString error = QStringLiteral("sub.cat|2|e");
-        QTest::addRow("by default no debug") << QString() << QStringList{warning, error};
-        QTest::addRow("debug on") << QStringLiteral("sub.cat.debug=true") << QStringList{debug, warning, error};
-        QTest::addRow("all off") << QStringLiteral("sub.cat*=false") << QStringList();
+        const QString debug = u"sub.cat|0|d \"é\""_s;
+        const QString warning = u"sub.cat|1|w"_s;
+        const QString error = u"sub.cat|2|e"_s;
+        addRows<QString, QStringList>({
+            {"by default no debug", {}, {warning, error}},
+            {"debug on", u"sub.cat.debug=true"_s, {debug, warning, error}},
+            {"all off", u"sub.cat*=false"_s, {}},
+        });
     }
     void entriesObeyTheFilterRules()
     {
-        QFETCH(const QString, rules);
-        QFETCH(const QStringList, written);
+        const auto [rules, written] = row<QString, QStringList>();
         QLoggingCategory::setFilterRules(rules);
         const Log log("sub", "cat");
         QCOMPARE(log.isDebugEnabled(), written.size() == 3);

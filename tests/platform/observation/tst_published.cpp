@@ -1,9 +1,12 @@
 #include "platform/observation/published.h"
 
+#include "../../shared/table.h"
+
 #include <QStringList>
 #include <QtTest>
 
 using namespace favrin::platform;
+using namespace Qt::StringLiterals;
 
 namespace {
 
@@ -30,13 +33,14 @@ private Q_SLOTS:
 
     void assignmentAnnouncesDeliversThenStores_data()
     {
-        QTest::addColumn<int>("assigned");
-        QTest::addRow("another value") << 2;
-        QTest::addRow("an equal value") << 1;
+        addRows<int>({
+            {"another value", 2},
+            {"an equal value", 1},
+        });
     }
     void assignmentAnnouncesDeliversThenStores()
     {
-        QFETCH(const int, assigned);
+        const auto [assigned] = row<int>();
         keep(m_owner->objectWillChange().sink([this](Nothing) { note("will", m_owner->number()); }));
         keep(m_owner->number.publisher().sink([this](int value) {
             note("first", value);
@@ -44,10 +48,10 @@ private Q_SLOTS:
         }));
         keep(m_owner->number.publisher().sink([this](int value) { note("second", value); }));
         m_owner->number.onStored([this] { note("hook", m_owner->number()); });
-        QCOMPARE(takeLog(), QStringLiteral("first 1, stored 1, second 1"));
+        QCOMPARE(takeLog(), u"first 1, stored 1, second 1"_s);
 
         m_owner->number.set(assigned);
-        QCOMPARE(takeLog(), QStringLiteral("will 1, first %1, stored 1, second %1, hook %1").arg(assigned));
+        QCOMPARE(takeLog(), u"will 1, first %1, stored 1, second %1, hook %1"_s.arg(assigned));
     }
 
     void innerAssignmentIsCompleteBeforeTheOuterGoesOn()
@@ -61,7 +65,7 @@ private Q_SLOTS:
         m_owner->number.onStored([this] { note("hook", m_owner->number()); });
         takeLog();
         m_owner->number.set(2);
-        QCOMPARE(takeLog(), QStringLiteral("a 2, a 3, b 3, hook 3, b 2, hook 2"));
+        QCOMPARE(takeLog(), u"a 2, a 3, b 3, hook 3, b 2, hook 2"_s);
         QCOMPARE(m_owner->number(), 2);
     }
 
@@ -75,7 +79,7 @@ private Q_SLOTS:
             // The value given must not change under the subscriber.
             QCOMPARE(value, before);
         }));
-        QCOMPARE(takeLog(), QStringLiteral("got 5, got 1"));
+        QCOMPARE(takeLog(), u"got 5, got 1"_s);
         QCOMPARE(m_owner->number(), 5);
     }
 
@@ -86,24 +90,23 @@ private Q_SLOTS:
                 keep(m_owner->number.publisher().sink([this](int late) { note("late", late); }));
         }));
         m_owner->number.set(2);
-        QCOMPARE(takeLog(), QStringLiteral("late 1, late 2"));
+        QCOMPARE(takeLog(), u"late 1, late 2"_s);
     }
 
     void cancelDuringADelivery_data()
     {
-        QTest::addColumn<QList<int>>("cancelled");
-        QTest::addColumn<QString>("delivered");
-        QTest::addRow("itself") << QList<int>{1} << QStringLiteral("0 2, 1 2, 2 2, 0 3, 2 3");
-        QTest::addRow("one before") << QList<int>{0} << QStringLiteral("0 2, 1 2, 2 2, 1 3, 2 3");
-        QTest::addRow("one after") << QList<int>{2} << QStringLiteral("0 2, 1 2, 0 3, 1 3");
-        QTest::addRow("all") << QList<int>{0, 1, 2} << QStringLiteral("0 2, 1 2");
+        addRows<QList<int>, QString>({
+            {"itself", {1}, u"0 2, 1 2, 2 2, 0 3, 2 3"_s},
+            {"one before", {0}, u"0 2, 1 2, 2 2, 1 3, 2 3"_s},
+            {"one after", {2}, u"0 2, 1 2, 0 3, 1 3"_s},
+            {"all", {0, 1, 2}, u"0 2, 1 2"_s},
+        });
     }
     void cancelDuringADelivery()
     {
-        QFETCH(const QList<int>, cancelled);
-        QFETCH(const QString, delivered);
+        const auto [cancelled, delivered] = row<QList<int>, QString>();
         for (int index = 0; index < 3; ++index) {
-            keep(m_owner->number.publisher().sink([this, index, cancelled](int value) {
+            keep(m_owner->number.publisher().sink([this, index, cancelled = cancelled](int value) {
                 note(QByteArray::number(index), value);
                 for (const int other : index == 1 && value == 2 ? cancelled : QList<int>())
                     m_kept[static_cast<std::size_t>(other)].cancel();
@@ -117,19 +120,16 @@ private Q_SLOTS:
 
     void destroyingTheOwnerDuringAnAssignment_data()
     {
-        QTest::addColumn<bool>("inAnnouncement");
-        QTest::addColumn<bool>("nested");
-        QTest::addColumn<QString>("delivered");
-        QTest::addRow("announcement") << true << false << QString();
-        QTest::addRow("delivery") << false << false << QStringLiteral("first 2");
-        QTest::addRow("inner delivery") << false << true << QStringLiteral("first 2, first 3");
+        addRows<bool, bool, QString>({
+            {"announcement", true, false, {}},
+            {"delivery", false, false, u"first 2"_s},
+            {"inner delivery", false, true, u"first 2, first 3"_s},
+        });
     }
     void destroyingTheOwnerDuringAnAssignment()
     {
-        QFETCH(const bool, inAnnouncement);
-        QFETCH(const bool, nested);
-        QFETCH(const QString, delivered);
-        keep(m_owner->number.publisher().sink([=, this](int value) {
+        const auto [inAnnouncement, nested, delivered] = row<bool, bool, QString>();
+        keep(m_owner->number.publisher().sink([this, nested = nested](int value) {
             note("first", value);
             if (nested && value == 2)
                 m_owner->number.set(3);
@@ -183,17 +183,14 @@ private Q_SLOTS:
         takeLog();
         m_owner->number.set(2);
         m_owner->number.set(3);
-        QCOMPARE(takeLog(), QStringLiteral("inner 2"));
+        QCOMPARE(takeLog(), u"inner 2"_s);
         QVERIFY(watch.expired());
     }
 
 private:
     void keep(Subscription subscription) { m_kept.push_back(std::move(subscription)); }
-    void note(const QByteArray &who, int value)
-    {
-        m_log << QStringLiteral("%1 %2").arg(QString::fromLatin1(who)).arg(value);
-    }
-    QString takeLog() { return std::exchange(m_log, {}).join(QStringLiteral(", ")); }
+    void note(const QByteArray &who, int value) { m_log << u"%1 %2"_s.arg(QString::fromLatin1(who)).arg(value); }
+    QString takeLog() { return std::exchange(m_log, {}).join(u", "_s); }
 
     std::unique_ptr<Owner> m_owner;
     QStringList m_log;

@@ -1,5 +1,7 @@
 #include "platform/observation/publisher.h"
 
+#include "../../shared/table.h"
+
 #include <QStringList>
 #include <QtTest>
 
@@ -8,15 +10,14 @@ using namespace favrin::platform;
 namespace {
 
 using MaybeInt = std::optional<int>;
+using namespace Qt::StringLiterals;
 
 QString text(const MaybeInt &value)
 {
-    return value ? QString::number(*value) : QStringLiteral("none");
+    return value ? QString::number(*value) : u"none"_s;
 }
 
 } // namespace
-
-Q_DECLARE_METATYPE(MaybeInt)
 
 /** The operators: map, duplicate removal, latest of two. */
 class PublisherTest : public QObject
@@ -26,16 +27,15 @@ class PublisherTest : public QObject
 private Q_SLOTS:
     void removeDuplicatesDropsOnlyRepetitions_data()
     {
-        QTest::addColumn<QList<MaybeInt>>("sent");
-        QTest::addColumn<QString>("received");
-        QTest::addRow("none first") << QList<MaybeInt>{{}, {}, 1} << QStringLiteral("none 1");
-        QTest::addRow("repetitions") << QList<MaybeInt>{1, 1, 2, 2, 1} << QStringLiteral("1 2 1");
-        QTest::addRow("back to none") << QList<MaybeInt>{1, {}, {}, 1} << QStringLiteral("1 none 1");
+        addRows<QList<MaybeInt>, QString>({
+            {"none first", {{}, {}, 1}, u"none 1"_s},
+            {"repetitions", {1, 1, 2, 2, 1}, u"1 2 1"_s},
+            {"back to none", {1, {}, {}, 1}, u"1 none 1"_s},
+        });
     }
     void removeDuplicatesDropsOnlyRepetitions()
     {
-        QFETCH(const QList<MaybeInt>, sent);
-        QFETCH(const QString, received);
+        const auto [sent, received] = row<QList<MaybeInt>, QString>();
         Subject<MaybeInt> subject;
         QStringList log;
         const auto subscription =
@@ -69,29 +69,28 @@ private Q_SLOTS:
         });
         subject.send(1);
         subject.send(2);
-        QCOMPARE(log.join(u' '), QStringLiteral("1 2"));
+        QCOMPARE(log.join(u' '), u"1 2"_s);
     }
 
     void latestOfTwo_data()
     {
-        QTest::addColumn<QString>("sent");
-        QTest::addColumn<QString>("received");
-        QTest::addRow("one side alone says nothing") << QStringLiteral("a1 a2") << QString();
-        QTest::addRow("complete with the second") << QStringLiteral("a1 b1") << QStringLiteral("1,1");
-        QTest::addRow("complete with the first") << QStringLiteral("b1 a1") << QStringLiteral("1,1");
-        QTest::addRow("earlier values are gone") << QStringLiteral("a1 a2 b1") << QStringLiteral("2,1");
-        QTest::addRow("either side emits") << QStringLiteral("a1 b1 a2 b2 b2") << QStringLiteral("1,1 2,1 2,2 2,2");
+        addRows<QString, QString>({
+            {"one side alone says nothing", u"a1 a2"_s, {}},
+            {"complete with the second", u"a1 b1"_s, u"1,1"_s},
+            {"complete with the first", u"b1 a1"_s, u"1,1"_s},
+            {"earlier values are gone", u"a1 a2 b1"_s, u"2,1"_s},
+            {"either side emits", u"a1 b1 a2 b2 b2"_s, u"1,1 2,1 2,2 2,2"_s},
+        });
     }
     void latestOfTwo()
     {
-        QFETCH(const QString, sent);
-        QFETCH(const QString, received);
+        const auto [sent, received] = row<QString, QString>();
         Subject<int> a;
         Subject<int> b;
         QStringList log;
         const auto subscription =
             combineLatest(a.publisher(), b.publisher()).sink([&](const std::pair<int, int> &pair) {
-                log << QStringLiteral("%1,%2").arg(pair.first).arg(pair.second);
+                log << u"%1,%2"_s.arg(pair.first).arg(pair.second);
             });
         for (const auto &step : sent.split(u' '))
             (step.startsWith(u'a') ? a : b).send(step.mid(1).toInt());
@@ -129,7 +128,7 @@ private Q_SLOTS:
         a.reset();
         b.send(2);
         b.send(3);
-        QCOMPARE(log.join(u' '), QStringLiteral("12 13"));
+        QCOMPARE(log.join(u' '), u"12 13"_s);
     }
 };
 

@@ -1,10 +1,13 @@
 #include "platform/viewcontroller/viewcontroller.h"
 
+#include "../../shared/table.h"
+
 #include <QQuickWindow>
 #include <QSignalSpy>
 #include <QtTest>
 
 using namespace favrin::platform;
+using namespace Qt::StringLiterals;
 
 namespace {
 
@@ -54,6 +57,8 @@ private:
     QStringList &m_log;
 };
 
+using Cause = std::function<void(Controller &)>;
+
 } // namespace
 
 /** What controllers hear, in which order, and when they lay out. */
@@ -66,7 +71,7 @@ private Q_SLOTS:
     {
         m_window = std::make_unique<QQuickWindow>();
         m_window->resize(300, 300);
-        m_parent = std::make_unique<Controller>(QStringLiteral("p"), m_log);
+        m_parent = std::make_unique<Controller>(u"p"_s, m_log);
         m_child = nullptr;
         m_log.clear();
     }
@@ -78,17 +83,14 @@ private Q_SLOTS:
 
     void appearance_data()
     {
-        QTest::addColumn<bool>("appearedBefore");
-        QTest::addColumn<QString>("heard");
-        QTest::addRow("child first") << false
-                                     << QStringLiteral("p load, p loaded, c load, c loaded, p appear, c appear");
-        QTest::addRow("child joins later")
-            << true << QStringLiteral("p load, p loaded, p appear, c load, c loaded, c appear");
+        addRows<bool, QString>({
+            {"child first", false, u"p load, p loaded, c load, c loaded, p appear, c appear"_s},
+            {"child joins later", true, u"p load, p loaded, p appear, c load, c loaded, c appear"_s},
+        });
     }
     void appearance()
     {
-        QFETCH(const bool, appearedBefore);
-        QFETCH(const QString, heard);
+        const auto [appearedBefore, heard] = row<bool, QString>();
         m_parent->setAppeared(appearedBefore);
         m_parent->view();
         join();
@@ -98,7 +100,7 @@ private Q_SLOTS:
         QVERIFY(m_child->hasAppeared());
         m_parent->setAppeared(false);
         m_parent->setAppeared(false);
-        QCOMPARE(takeLog(), QStringLiteral("c disappear, p disappear"));
+        QCOMPARE(takeLog(), u"c disappear, p disappear"_s);
     }
 
     void traitsReachWhoeverHasOthers()
@@ -107,30 +109,29 @@ private Q_SLOTS:
         join();
         takeLog();
         m_parent->setTraits(m_parent->traits());
-        QCOMPARE(takeLog(), QStringLiteral("p first traits, c first traits"));
+        QCOMPARE(takeLog(), u"p first traits, c first traits"_s);
         m_parent->setTraits(popover);
         m_parent->setTraits(popover);
-        QCOMPARE(takeLog(), QStringLiteral("p traits, c traits"));
-        auto late = std::make_unique<Controller>(QStringLiteral("l"), m_log);
+        QCOMPARE(takeLog(), u"p traits, c traits"_s);
+        auto late = std::make_unique<Controller>(u"l"_s, m_log);
         QVERIFY(m_parent->addChild(std::move(late))->traits() == popover);
-        QCOMPARE(takeLog(), QStringLiteral("l first traits"));
+        QCOMPARE(takeLog(), u"l first traits"_s);
     }
 
     void preferredContentSize_data()
     {
-        QTest::addColumn<QSizeF>("size");
-        QTest::addColumn<int>("announcements");
-        QTest::addRow("same") << QSizeF(360, 500) << 0;
-        QTest::addRow("hardly another") << QSizeF(360, 500 + 1e-13) << 1;
-        QTest::addRow("none") << QSizeF(0, 0) << 1;
-        QTest::addRow("negative") << QSizeF(-1, 5) << 0;
-        QTest::addRow("endless") << QSizeF(qInf(), 5) << 0;
-        QTest::addRow("not a number") << QSizeF(5, qQNaN()) << 0;
+        addRows<QSizeF, int>({
+            {"same", {360, 500}, 0},
+            {"hardly another", {360, 500 + 1e-13}, 1},
+            {"none", {0, 0}, 1},
+            {"negative", {-1, 5}, 0},
+            {"endless", {qInf(), 5}, 0},
+            {"not a number", {5, qQNaN()}, 0},
+        });
     }
     void preferredContentSize()
     {
-        QFETCH(const QSizeF, size);
-        QFETCH(const int, announcements);
+        const auto [size, announcements] = row<QSizeF, int>();
         m_parent->setPreferredContentSize({360, 500});
         const QSignalSpy spy(m_parent.get(), &ViewController::preferredContentSizeChanged);
         m_parent->setPreferredContentSize(size);
@@ -140,31 +141,36 @@ private Q_SLOTS:
 
     void whatCausesAPass_data()
     {
-        using Cause = std::function<void(Controller &)>;
-        QTest::addColumn<Cause>("cause");
-        QTest::addColumn<int>("passes");
-        QTest::addRow("nothing") << Cause([](Controller &) {}) << 0;
-        QTest::addRow("many requests") << Cause([](Controller &controller) {
-            for (int count = 0; count < 10; ++count)
-                controller.setNeedsLayout();
-        }) << 1;
-        QTest::addRow("another size") << Cause([](Controller &controller) {
-            controller.view()->setSize({50, 60});
-        }) << 1;
-        QTest::addRow("the same size") << Cause([](Controller &controller) {
-            controller.view()->setSize({100, 100});
-        }) << 0;
-        QTest::addRow("implicit size") << Cause([](Controller &controller) { controller.view()->setImplicitHeight(9); })
-                                       << 1;
-        QTest::addRow("request and at once") << Cause([](Controller &controller) {
-            controller.setNeedsLayout();
-            controller.layoutNow();
-        }) << 1;
+        addRows<Cause, int>({
+            {"nothing", [](auto &) {}, 0},
+            {"many requests",
+             [](auto &controller) {
+                 for (int count = 0; count < 10; ++count)
+                     controller.setNeedsLayout();
+             },
+             1},
+            {"another size",
+             [](auto &controller) {
+                 controller.view()->setSize({50, 60});
+             },
+             1},
+            {"the same size",
+             [](auto &controller) {
+                 controller.view()->setSize({100, 100});
+             },
+             0},
+            {"implicit size", [](auto &controller) { controller.view()->setImplicitHeight(9); }, 1},
+            {"request and at once",
+             [](auto &controller) {
+                 controller.setNeedsLayout();
+                 controller.layoutNow();
+             },
+             1},
+        });
     }
     void whatCausesAPass()
     {
-        QFETCH(const std::function<void(Controller &)>, cause);
-        QFETCH(const int, passes);
+        const auto [cause, passes] = row<Cause, int>();
         show();
         m_parent->passes = 0;
         cause(*m_parent);
@@ -193,19 +199,17 @@ private Q_SLOTS:
 
     void requestsDuringAPass_data()
     {
-        QTest::addColumn<int>("requests");
-        QTest::addColumn<int>("passesAtOnce");
-        QTest::addColumn<int>("passesInAll");
-        QTest::addRow("none") << 0 << 1 << 1;
-        QTest::addRow("one") << 1 << 2 << 2;
-        QTest::addRow("two") << 2 << 2 << 3;
-        QTest::addRow("many") << 9 << 2 << 10;
+        addRows<int, int, int>({
+            {"none", 0, 1, 1},
+            {"one", 1, 2, 2},
+            {"two", 2, 2, 3},
+            {"many", 9, 2, 10},
+        });
     }
     void requestsDuringAPass()
     {
-        QFETCH(int, requests);
-        QFETCH(const int, passesAtOnce);
-        QFETCH(const int, passesInAll);
+        const auto [asked, passesAtOnce, passesInAll] = row<int, int, int>();
+        int requests = asked;
         show();
         m_parent->passes = 0;
         m_parent->onLayout = [&](Controller &controller) {
@@ -242,10 +246,10 @@ private Q_SLOTS:
         takeLog();
         m_parent->onLayout = [this](Controller &) { m_child->view()->setSize({10, 10}); };
         m_parent->layoutNow();
-        QCOMPARE(takeLog(), QStringLiteral("p will layout, p did layout, c will layout, c did layout"));
+        QCOMPARE(takeLog(), u"p will layout, p did layout, c will layout, c did layout"_s);
         m_child->setNeedsLayout();
         waitForFrames(2);
-        QCOMPARE(takeLog(), QStringLiteral("c will layout, c did layout"));
+        QCOMPARE(takeLog(), u"c will layout, c did layout"_s);
     }
 
     void aViewOutsideAnyWindowWaits()
@@ -269,7 +273,7 @@ private Q_SLOTS:
             bool *hadParent = nullptr;
         };
         bool hadParent = true;
-        auto child = std::make_unique<Leaving>(QStringLiteral("c"), m_log);
+        auto child = std::make_unique<Leaving>(u"c"_s, m_log);
         child->hadParent = &hadParent;
         const QPointer<QQuickItem> childView = child->view();
         childView->setParentItem(m_parent->view());
@@ -282,7 +286,7 @@ private Q_SLOTS:
 private:
     void join()
     {
-        auto child = std::make_unique<Controller>(QStringLiteral("c"), m_log);
+        auto child = std::make_unique<Controller>(u"c"_s, m_log);
         m_child = child.get();
         m_parent->addChild(std::move(child));
         m_child->view();
@@ -303,7 +307,7 @@ private:
             QVERIFY(spy.wait());
         }
     }
-    QString takeLog() { return std::exchange(m_log, {}).join(QStringLiteral(", ")); }
+    QString takeLog() { return std::exchange(m_log, {}).join(u", "_s); }
 
     std::unique_ptr<QQuickWindow> m_window;
     std::unique_ptr<Controller> m_parent;
