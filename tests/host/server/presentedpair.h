@@ -53,6 +53,17 @@ public:
         service.events.clear();
     }
 
+    /** What the service heard of this kind of device: "enter 1 2, frame". */
+    QString heard(const std::string &device) const
+    {
+        QStringList words;
+        for (const std::string &event : service.eventsOf(device + ' '))
+            words << QString::fromStdString(event.substr(device.size() + 1));
+        return words.join(QStringLiteral(", "));
+    }
+    /** What its owner was told. */
+    QString told() const { return delegate.calls.join(QStringLiteral(", ")); }
+
     /** "interface code" of the error that the service was told, or "" for none. */
     std::string protocolError() const
     {
@@ -72,12 +83,16 @@ public:
 };
 
 /** Compares the number of open files before and after each test. */
-class OpenFiles
+class ServerTest : public QObject
 {
+    Q_OBJECT
+
 public:
-    static int count() { return static_cast<int>(QDir(QStringLiteral("/proc/self/fd")).count()); }
-    void remember() { m_before = count(); }
-    void check() const { QCOMPARE(count(), m_before); }
+    static int openFiles() { return static_cast<int>(QDir(QStringLiteral("/proc/self/fd")).count()); }
+
+private Q_SLOTS:
+    void init() { m_before = openFiles(); }
+    void cleanup() { QCOMPARE(openFiles(), m_before); }
 
 private:
     int m_before = 0;

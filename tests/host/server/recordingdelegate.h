@@ -2,6 +2,8 @@
 
 #include "host/server/remoteviewserver.h"
 
+#include <QStringList>
+
 #include <functional>
 #include <string>
 #include <vector>
@@ -17,6 +19,7 @@ public:
         std::optional<favrin::platform::Color> color;
         std::optional<std::string> colorspace;
         bool isVolatile = false;
+        bool operator==(const Pick &) const = default;
     };
     struct ShownFrame
     {
@@ -40,47 +43,50 @@ public:
         if (onFrame)
             onFrame();
     }
-    void surfaceDidUnmap() override { calls.push_back("unmap"); }
-    void serviceIsReady() override { calls.push_back("ready"); }
-    void serviceDidPrepare(std::uint32_t serial) override { calls.push_back("prepared " + std::to_string(serial)); }
+    void surfaceDidUnmap() override { calls << QStringLiteral("unmap"); }
+    void serviceIsReady() override { calls << QStringLiteral("ready"); }
+    void serviceDidPrepare(std::uint32_t serial) override { calls << QStringLiteral("prepared %1").arg(serial); }
     void pickerDidSelectColor(const std::optional<favrin::platform::Color> &color,
                               const std::optional<std::string> &colorspace, bool isVolatile) override
     {
         picks.push_back({color, colorspace, isVolatile});
     }
-    void pickerDidShowEyedropper() override { calls.push_back("show eyedropper"); }
-    void pickerDidFloatEyedropper() override { calls.push_back("float eyedropper"); }
-    void pickerDidDismissEyedropper() override { calls.push_back("dismiss eyedropper"); }
+    void pickerDidShowEyedropper() override { calls << QStringLiteral("show eyedropper"); }
+    void pickerDidFloatEyedropper() override { calls << QStringLiteral("float eyedropper"); }
+    void pickerDidDismissEyedropper() override { calls << QStringLiteral("dismiss eyedropper"); }
     void colorPickerDidFinish() override
     {
-        calls.push_back("finish");
+        calls << QStringLiteral("finish");
         if (closeOnFinish)
             closeOnFinish->closeConnection();
     }
     void preferredContentSizeDidChange(double width, double height) override
     {
-        calls.push_back("size " + std::to_string(width) + " " + std::to_string(height));
+        calls << QStringLiteral("size %1 %2").arg(width).arg(height);
     }
     void focusDidLeave(favrin::remote::FocusDirection direction) override
     {
-        calls.push_back("leave " + std::to_string(static_cast<int>(direction)));
+        calls << QStringLiteral("leave %1").arg(static_cast<int>(direction));
     }
     void backgroundEffectDidChange(favrin::remote::BackgroundEffect effect) override
     {
-        calls.push_back("effect " + std::to_string(static_cast<int>(effect)));
+        calls << QStringLiteral("effect %1").arg(static_cast<int>(effect));
     }
     void textInputDidChange(const favrin::host::server::TextInputState &state) override { textInputs.push_back(state); }
     void serviceDidOfferClipboard(const std::vector<std::string> &mimeTypes) override { offers.push_back(mimeTypes); }
     void serviceWantsClipboard(const std::string &mimeType, int descriptor) override
     {
-        calls.push_back("wants " + mimeType);
+        calls << QStringLiteral("wants ") + QString::fromStdString(mimeType);
         static_cast<void>(!::write(descriptor, "host", 4));
         ::close(descriptor);
     }
-    void cursorDidChange(const std::string &name) override { calls.push_back("cursor " + name); }
+    void cursorDidChange(const std::string &name) override
+    {
+        calls << QStringLiteral("cursor ") + QString::fromStdString(name);
+    }
     void serviceResponsivenessDidChange(bool responsive) override
     {
-        calls.push_back(responsive ? "responsive" : "unresponsive");
+        calls << (responsive ? QStringLiteral("responsive") : QStringLiteral("unresponsive"));
     }
     void serverDidWarn(const std::string &message) override { warnings.push_back(message); }
     void connectionDidClose(favrin::host::server::CloseReason reason, const std::string &detail) override
@@ -88,7 +94,13 @@ public:
         closes.push_back({reason, detail});
     }
 
-    std::vector<std::string> calls;
+    /** Whether the end was told, once, with this reason. */
+    bool isClosedFor(favrin::host::server::CloseReason reason) const
+    {
+        return closes.size() == 1 && closes[0].reason == reason;
+    }
+
+    QStringList calls;
     std::vector<ShownFrame> frames;
     std::vector<Pick> picks;
     std::vector<favrin::host::server::TextInputState> textInputs;

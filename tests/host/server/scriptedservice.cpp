@@ -1,7 +1,9 @@
 #include "scriptedservice.h"
 
+#include <cctype>
 #include <cerrno>
 #include <cstring>
+#include <set>
 
 #include <poll.h>
 #include <sys/mman.h>
@@ -15,27 +17,40 @@ extern "C" __attribute__((visibility("default"))) const char *__lsan_default_sup
 
 namespace {
 
-ScriptedService &self(void *data)
+std::string prefixOf(std::string_view interface)
 {
-    return *static_cast<ScriptedService *>(data);
+    for (const std::string_view device : {"wl_pointer", "wl_keyboard", "wl_touch", "wl_seat"}) {
+        if (interface == device)
+            return std::string(device.substr(3)) + ' ';
+    }
+    return interface == zwp_text_input_v1_interface.name ? "text " : "";
 }
 
-std::string text(const char *value)
+/** How many arguments an event begins with that differ from run to run: serials and times. */
+std::size_t stampsOf(std::string_view event)
 {
-    return value ? value : "(null)";
+    static const std::set<std::string_view> both = {"button", "key", "down", "up"};
+    static const std::set<std::string_view> one = {"enter", "leave", "motion", "axis", "axis_stop", "modifiers"};
+    return both.contains(event) ? 2 : one.contains(event) ? 1 : 0;
 }
 
-template<class... Values>
-std::string line(const char *name, Values... values)
+/** As it is noted; descriptors and objects that are there are not. */
+std::string textOf(char type, const wl_argument &argument)
 {
-    std::string result = name;
-    ((result += ' ', result += std::to_string(values)), ...);
-    return result;
-}
-
-int fixed(wl_fixed_t value)
-{
-    return wl_fixed_to_int(value);
+    switch (type) {
+    case 'i':
+        return ' ' + std::to_string(argument.i);
+    case 'u':
+        return ' ' + std::to_string(argument.u);
+    case 'f':
+        return ' ' + std::to_string(wl_fixed_to_int(argument.f));
+    case 's':
+        return std::string(" ") + (argument.s ? argument.s : "(null)");
+    case 'o':
+        return argument.o ? "" : " none";
+    default:
+        return "";
+    }
 }
 
 std::vector<double> numbersOf(const wl_array *array)
@@ -48,11 +63,63 @@ std::vector<double> numbersOf(const wl_array *array)
 
 } // namespace
 
+int ScriptedService::hear(const void *, void *target, std::uint32_t, const wl_message *message, wl_argument *arguments)
+{
+    auto *proxy = static_cast<wl_proxy *>(target);
+    auto &service = *static_cast<ScriptedService *>(wl_proxy_get_user_data(proxy));
+    const std::string_view interface = wl_proxy_get_class(proxy);
+    std::string line = prefixOf(interface) + message->name;
+    const std::size_t stamps = stampsOf(message->name);
+    std::size_t index = 0;
+    for (const char type : std::string_view(message->signature)) {
+        if (!std::isalpha(type))
+            continue;
+        const wl_argument &argument = arguments[index++];
+        if (type == 'a' && interface == favrin_remote_view_v1_interface.name)
+            service.numbers[message->name].push_back(numbersOf(argument.a));
+        else if (type == 'a')
+            line += ' ' + std::to_string(argument.a->size / sizeof(std::uint32_t));
+        else if (index > stamps)
+            line += textOf(type, argument);
+        // What follows is its size.
+        if (type == 'h')
+            break;
+    }
+    if (stamps == 2)
+        service.inputSerial = arguments[0].u;
+    if (interface == xdg_surface_interface.name)
+        service.configureSerials.push_back(arguments[0].u);
+    else
+        service.events.push_back(line);
+    service.react(message->name, arguments);
+    return 0;
+}
+
+void ScriptedService::react(std::string_view event, const wl_argument *arguments)
+{
+    if (event == "ping" && answersPings) {
+        xdg_wm_base_pong(shell, arguments[0].u);
+    } else if (event == "keymap") {
+        void *memory = ::mmap(nullptr, arguments[2].u, PROT_READ, MAP_PRIVATE, arguments[1].h, 0);
+        keymap = memory == MAP_FAILED ? "" : static_cast<const char *>(memory);
+        ::munmap(memory, arguments[2].u);
+        keymapIsWritable = ::pwrite(arguments[1].h, "x", 1, 0) == 1;
+        ::close(arguments[1].h);
+    } else if (event == "data_offer") {
+        listenTo(arguments[0].o);
+    } else if (event == "selection") {
+        dataOffer = reinterpret_cast<wl_data_offer *>(arguments[0].o);
+    } else if (event == "send") {
+        static_cast<void>(!::write(arguments[1].h, "service", 7));
+        ::close(arguments[1].h);
+    }
+}
+
 ScriptedService::ScriptedService(int descriptor) : display(wl_display_connect_to_fd(descriptor))
 {
     static const wl_registry_listener listener = {
         [](void *data, wl_registry *, std::uint32_t name, const char *interface, std::uint32_t version) {
-            self(data).globals[interface] = {name, version};
+            static_cast<ScriptedService *>(data)->globals[interface] = {name, version};
         },
         [](void *, wl_registry *, std::uint32_t) {},
     };
@@ -84,6 +151,11 @@ bool ScriptedService::read()
     return wl_display_read_events(display) == 0 && wl_display_dispatch_pending(display) > 0;
 }
 
+void ScriptedService::listenTo(void *proxy)
+{
+    wl_proxy_add_dispatcher(static_cast<wl_proxy *>(proxy), hear, nullptr, this);
+}
+
 void ScriptedService::bindAll()
 {
     const auto bind = [this](const wl_interface &interface) {
@@ -103,29 +175,18 @@ void ScriptedService::bindAll()
     touch = wl_seat_get_touch(seat);
     textInput = zwp_text_input_manager_v1_create_text_input(textInputManager);
     dataDevice = wl_data_device_manager_get_data_device(dataDeviceManager, seat);
-    listenToView();
-    listenToInput();
-    listenToShell();
-    listenToTextAndData();
+    for (void *proxy :
+         std::initializer_list<void *>{view, seat, pointer, keyboard, touch, shell, textInput, dataDevice})
+        listenTo(proxy);
 }
 
 void ScriptedService::makeToplevel()
 {
-    static const xdg_surface_listener surfaceListener = {
-        [](void *data, xdg_surface *, std::uint32_t serial) { self(data).configureSerials.push_back(serial); }};
-    static const xdg_toplevel_listener toplevelListener = [] {
-        xdg_toplevel_listener listener = {};
-        listener.configure = [](void *data, xdg_toplevel *, std::int32_t width, std::int32_t height, wl_array *states) {
-            self(data).note(line("configure", width, height, states->size / sizeof(std::uint32_t)));
-        };
-        listener.close = [](void *data, xdg_toplevel *) { self(data).note("close"); };
-        return listener;
-    }();
     surface = wl_compositor_create_surface(compositor);
     xdgSurface = xdg_wm_base_get_xdg_surface(shell, surface);
-    xdg_surface_add_listener(xdgSurface, &surfaceListener, this);
+    listenTo(xdgSurface);
     toplevel = xdg_surface_get_toplevel(xdgSurface);
-    xdg_toplevel_add_listener(toplevel, &toplevelListener, this);
+    listenTo(toplevel);
     wl_surface_commit(surface);
 }
 
@@ -158,8 +219,7 @@ wl_buffer *ScriptedService::makeBuffer(int width, int height, std::uint32_t pixe
     ::close(memory);
     wl_buffer *buffer = wl_shm_pool_create_buffer(pool, 0, width, height, width * 4, format);
     wl_shm_pool_destroy(pool);
-    static const wl_buffer_listener listener = {[](void *data, wl_buffer *) { self(data).note("release"); }};
-    wl_buffer_add_listener(buffer, &listener, this);
+    listenTo(buffer);
     return buffer;
 }
 
@@ -178,179 +238,4 @@ std::vector<std::string> ScriptedService::eventsOf(const std::string &prefix) co
             found.push_back(event);
     }
     return found;
-}
-
-void ScriptedService::listenToView()
-{
-    static const favrin_remote_view_v1_listener listener = [] {
-        favrin_remote_view_v1_listener l = {};
-        using View = favrin_remote_view_v1;
-        l.presentation_context = [](void *d, View *, std::uint32_t v) { self(d).note(line("context", v)); };
-        l.appearance = [](void *d, View *, std::uint32_t v) { self(d).note(line("appearance", v)); };
-        l.layout_direction = [](void *d, View *, std::uint32_t v) { self(d).note(line("direction", v)); };
-        l.text_size_category = [](void *d, View *, std::uint32_t v) { self(d).note(line("text_size", v)); };
-        l.display = [](void *d, View *, std::uint32_t v, const char *id) {
-            self(d).note(line("display", v) + " " + id);
-        };
-        l.locale = [](void *d, View *, const char *name) { self(d).note("locale " + text(name)); };
-        l.accessibility_options = [](void *d, View *, std::uint32_t v) { self(d).note(line("accessibility", v)); };
-        l.traits_done = [](void *d, View *) { self(d).note("traits_done"); };
-        l.title = [](void *d, View *, const char *value) { self(d).title = value; };
-        l.suggested_colors = [](void *d, View *, const char *space, wl_array *colors) {
-            self(d).note("colors " + text(space));
-            self(d).colorRuns.push_back(numbersOf(colors));
-        };
-        l.options = [](void *d, View *, std::uint32_t v) { self(d).note(line("options", v)); };
-        l.grid_style = [](void *d, View *, std::int32_t v) { self(d).note(line("grid_style", v)); };
-        l.host_window = [](void *d, View *, wl_array *values) { self(d).geometry = numbersOf(values); };
-        l.configuration_done = [](void *d, View *) { self(d).note("configuration_done"); };
-        l.set_selected_color = [](void *d, View *, wl_array *color, const char *space, const char *colorspace) {
-            self(d).note("color " + text(space) + " " + text(colorspace));
-            self(d).colorRuns.push_back(numbersOf(color));
-        };
-        l.prepare_for_display = [](void *d, View *, std::uint32_t serial) { self(d).note(line("prepare", serial)); };
-        l.present = [](void *d, View *) { self(d).note("present"); };
-        l.color_picker_did_finish = [](void *d, View *) { self(d).note("finish"); };
-        return l;
-    }();
-    favrin_remote_view_v1_add_listener(view, &listener, this);
-}
-
-void ScriptedService::listenToInput()
-{
-    static const wl_pointer_listener pointers = [] {
-        wl_pointer_listener l = {};
-        l.enter = [](void *d, wl_pointer *, std::uint32_t serial, wl_surface *, wl_fixed_t x, wl_fixed_t y) {
-            self(d).inputSerial = serial;
-            self(d).note(line("pointer enter", fixed(x), fixed(y)));
-        };
-        l.leave = [](void *d, wl_pointer *, std::uint32_t, wl_surface *) { self(d).note("pointer leave"); };
-        l.motion = [](void *d, wl_pointer *, std::uint32_t, wl_fixed_t x, wl_fixed_t y) {
-            self(d).note(line("pointer motion", fixed(x), fixed(y)));
-        };
-        l.button = [](void *d, wl_pointer *, std::uint32_t serial, std::uint32_t, std::uint32_t button,
-                      std::uint32_t state) {
-            self(d).inputSerial = serial;
-            self(d).note(line("pointer button", button, state));
-        };
-        l.axis = [](void *d, wl_pointer *, std::uint32_t, std::uint32_t axis, wl_fixed_t value) {
-            self(d).note(line("pointer axis", axis, fixed(value)));
-        };
-        l.frame = [](void *d, wl_pointer *) { self(d).note("pointer frame"); };
-        l.axis_source = [](void *d, wl_pointer *, std::uint32_t source) {
-            self(d).note(line("pointer source", source));
-        };
-        l.axis_stop = [](void *d, wl_pointer *, std::uint32_t, std::uint32_t axis) {
-            self(d).note(line("pointer stop", axis));
-        };
-        l.axis_discrete = [](void *d, wl_pointer *, std::uint32_t axis, std::int32_t clicks) {
-            self(d).note(line("pointer discrete", axis, clicks));
-        };
-        return l;
-    }();
-    static const wl_keyboard_listener keyboards = [] {
-        wl_keyboard_listener l = {};
-        l.keymap = [](void *d, wl_keyboard *, std::uint32_t format, std::int32_t descriptor, std::uint32_t size) {
-            self(d).note(line("keyboard keymap", format));
-            void *memory = ::mmap(nullptr, size, PROT_READ, MAP_PRIVATE, descriptor, 0);
-            self(d).keymap = memory == MAP_FAILED ? "" : static_cast<const char *>(memory);
-            ::munmap(memory, size);
-            self(d).keymapIsWritable = ::pwrite(descriptor, "x", 1, 0) == 1;
-            ::close(descriptor);
-        };
-        l.enter = [](void *d, wl_keyboard *, std::uint32_t serial, wl_surface *, wl_array *keys) {
-            self(d).inputSerial = serial;
-            self(d).note(line("keyboard enter", keys->size / sizeof(std::uint32_t)));
-        };
-        l.leave = [](void *d, wl_keyboard *, std::uint32_t, wl_surface *) { self(d).note("keyboard leave"); };
-        l.key = [](void *d, wl_keyboard *, std::uint32_t serial, std::uint32_t, std::uint32_t key,
-                   std::uint32_t state) {
-            self(d).inputSerial = serial;
-            self(d).note(line("keyboard key", key, state));
-        };
-        l.modifiers = [](void *d, wl_keyboard *, std::uint32_t, std::uint32_t depressed, std::uint32_t latched,
-                         std::uint32_t locked, std::uint32_t group) {
-            self(d).note(line("keyboard modifiers", depressed, latched, locked, group));
-        };
-        l.repeat_info = [](void *d, wl_keyboard *, std::int32_t rate, std::int32_t delay) {
-            self(d).note(line("keyboard repeat", rate, delay));
-        };
-        return l;
-    }();
-    static const wl_touch_listener touches = [] {
-        wl_touch_listener l = {};
-        l.down = [](void *d, wl_touch *, std::uint32_t serial, std::uint32_t, wl_surface *, std::int32_t id,
-                    wl_fixed_t x, wl_fixed_t y) {
-            self(d).inputSerial = serial;
-            self(d).note(line("touch down", id, fixed(x), fixed(y)));
-        };
-        l.up = [](void *d, wl_touch *, std::uint32_t, std::uint32_t, std::int32_t id) {
-            self(d).note(line("touch up", id));
-        };
-        l.motion = [](void *d, wl_touch *, std::uint32_t, std::int32_t id, wl_fixed_t x, wl_fixed_t y) {
-            self(d).note(line("touch motion", id, fixed(x), fixed(y)));
-        };
-        l.frame = [](void *d, wl_touch *) { self(d).note("touch frame"); };
-        l.cancel = [](void *d, wl_touch *) { self(d).note("touch cancel"); };
-        return l;
-    }();
-    static const wl_seat_listener seats = {
-        .capabilities = [](void *d, wl_seat *, std::uint32_t all) { self(d).note(line("seat offers", all)); },
-        .name = [](void *, wl_seat *, const char *) {}};
-    wl_seat_add_listener(seat, &seats, this);
-    wl_pointer_add_listener(pointer, &pointers, this);
-    wl_keyboard_add_listener(keyboard, &keyboards, this);
-    wl_touch_add_listener(touch, &touches, this);
-}
-
-void ScriptedService::listenToShell()
-{
-    static const xdg_wm_base_listener listener = {[](void *data, xdg_wm_base *pinging, std::uint32_t serial) {
-        self(data).note("ping");
-        if (self(data).answersPings)
-            xdg_wm_base_pong(pinging, serial);
-    }};
-    xdg_wm_base_add_listener(shell, &listener, this);
-}
-
-void ScriptedService::listenToTextAndData()
-{
-    static const zwp_text_input_v1_listener texts = [] {
-        zwp_text_input_v1_listener l = {};
-        using Input = zwp_text_input_v1;
-        l.enter = [](void *d, Input *, wl_surface *) { self(d).note("text enter"); };
-        l.leave = [](void *d, Input *) { self(d).note("text leave"); };
-        l.modifiers_map = [](void *, Input *, wl_array *) {};
-        l.input_panel_state = [](void *d, Input *, std::uint32_t state) { self(d).note(line("text panel", state)); };
-        l.preedit_string = [](void *d, Input *, std::uint32_t serial, const char *shown, const char *commit) {
-            self(d).note(line("text preedit", serial) + " " + shown + " " + commit);
-        };
-        l.preedit_styling = [](void *, Input *, std::uint32_t, std::uint32_t, std::uint32_t) {};
-        l.preedit_cursor = [](void *d, Input *, std::int32_t index) { self(d).note(line("text cursor", index)); };
-        l.commit_string = [](void *d, Input *, std::uint32_t serial, const char *committed) {
-            self(d).note(line("text commit", serial) + " " + committed);
-        };
-        l.delete_surrounding_text = [](void *d, Input *, std::int32_t index, std::uint32_t length) {
-            self(d).note(line("text delete", index, length));
-        };
-        return l;
-    }();
-    static const wl_data_offer_listener offers = [] {
-        wl_data_offer_listener l = {};
-        l.offer = [](void *d, wl_data_offer *, const char *type) { self(d).note("offer " + text(type)); };
-        return l;
-    }();
-    static const wl_data_device_listener devices = [] {
-        wl_data_device_listener l = {};
-        l.data_offer = [](void *d, wl_data_device *, wl_data_offer *offer) {
-            wl_data_offer_add_listener(offer, &offers, d);
-        };
-        l.selection = [](void *d, wl_data_device *, wl_data_offer *offer) {
-            self(d).note(offer ? "selection" : "selection none");
-            self(d).dataOffer = offer;
-        };
-        return l;
-    }();
-    zwp_text_input_v1_add_listener(textInput, &texts, this);
-    wl_data_device_add_listener(dataDevice, &devices, this);
 }

@@ -3,6 +3,7 @@
 #include <cstdint>
 #include <map>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "favrin-remote-view-v1-client-protocol.h"
@@ -12,7 +13,8 @@
 
 /**
  * The other end of the socket, done by hand on libwayland-client: does exactly what a test tells it, right or wrong,
- * and keeps every event as a line of text.
+ * and keeps every event as a line of text: what kind of device it is of, its name, and its arguments without serials,
+ * times and objects.
  */
 class ScriptedService
 {
@@ -42,7 +44,8 @@ public:
 
     /** Lines that begin with @p prefix. */
     std::vector<std::string> eventsOf(const std::string &prefix) const;
-    void note(const std::string &line) { events.push_back(line); }
+    /** Notes the events of this one too. */
+    void listenTo(void *proxy);
 
     wl_display *display;
     wl_registry *registry = nullptr;
@@ -68,16 +71,12 @@ public:
     std::vector<std::uint32_t> configureSerials;
     std::uint32_t inputSerial = 0;
     bool answersPings = true;
-    /** Of the last suggested_colors, title and set_selected_color events. */
-    std::vector<std::vector<double>> colorRuns;
-    std::vector<double> geometry;
-    std::string title;
+    /** The arrays of the picker's own events, by their names. */
+    std::map<std::string, std::vector<std::vector<double>>> numbers;
     std::string keymap;
     bool keymapIsWritable = false;
 
 private:
-    void listenToView();
-    void listenToInput();
-    void listenToShell();
-    void listenToTextAndData();
+    static int hear(const void *, void *target, std::uint32_t, const wl_message *message, wl_argument *arguments);
+    void react(std::string_view event, const wl_argument *arguments);
 };

@@ -1,6 +1,7 @@
-#include "presentedpair.h"
-
 #include "host/server/serverlimits.h"
+
+#include "../../shared/table.h"
+#include "presentedpair.h"
 
 #include <array>
 #include <functional>
@@ -13,7 +14,6 @@ using namespace favrin::host::server;
 using Start = PresentedPair::Start;
 
 using Make = std::function<void(ScriptedService &)>;
-Q_DECLARE_METATYPE(Make)
 
 namespace {
 
@@ -32,16 +32,29 @@ void makePopup(ScriptedService &service)
     xdg_positioner_destroy(positioner);
 }
 
+using Words = std::vector<std::uint32_t>;
+
 /** One Wayland request as bytes. */
-std::vector<std::uint32_t> request(std::uint32_t object, std::uint32_t opcode, std::uint32_t size,
-                                   std::vector<std::uint32_t> arguments = {})
+Words request(std::uint32_t object, std::uint32_t opcode, std::uint32_t size, const Words &arguments = {})
 {
-    std::vector<std::uint32_t> words = {object, size << 16 | opcode};
+    Words words = {object, size << 16 | opcode};
     words.insert(words.end(), arguments.begin(), arguments.end());
     return words;
 }
 
-using Words = std::vector<std::uint32_t>;
+/** A server whose service is bytes written by hand. */
+struct Raw
+{
+    RecordingDelegate delegate;
+    RemoteViewServer server{delegate};
+    const int descriptor = server.openConnection();
+
+    void dispatch(int turns)
+    {
+        for (int turn = 0; turn < turns; ++turn)
+            server.dispatch();
+    }
+};
 
 /** Writes @p data, together with @p count descriptors of one file. */
 template<class Unit>
@@ -65,46 +78,35 @@ void sendFiles(int socket, std::span<const Unit> data, int file, std::size_t cou
 
 } // namespace
 
-Q_DECLARE_METATYPE(Words)
-
-class ServerLimitsTest : public QObject
+class ServerLimitsTest : public ServerTest
 {
     Q_OBJECT
 
 private Q_SLOTS:
-    void init() { m_files.remember(); }
-    void cleanup() { m_files.check(); }
-
     void objectsAreCounted_data()
     {
-        QTest::addColumn<std::string>("interface");
-        QTest::addColumn<int>("alreadyThere");
-        QTest::addColumn<Make>("make");
-        const auto row = [](const char *interface, int alreadyThere, Make make) {
-            QTest::newRow(interface) << std::string(interface) << alreadyThere << make;
-        };
-        row("wl_surface", 0, [](ScriptedService &s) { wl_compositor_create_surface(s.compositor); });
-        row("wl_region", 0, [](ScriptedService &s) { wl_compositor_create_region(s.compositor); });
-        row("wl_shm_pool", 0, [](ScriptedService &s) { s.makePool(4096); });
-        row("wl_buffer", 0, [](ScriptedService &s) { s.makeBuffer(2, 2, 0); });
-        row("wl_callback", 0, [](ScriptedService &s) {
-            if (!s.surface)
-                s.surface = wl_compositor_create_surface(s.compositor);
-            wl_surface_frame(s.surface);
-        });
-        row("xdg_popup", 0, makePopup);
-        row("wl_data_source", 0,
-            [](ScriptedService &s) { wl_data_device_manager_create_data_source(s.dataDeviceManager); });
-        row("zwp_text_input_v1", 1,
-            [](ScriptedService &s) { zwp_text_input_manager_v1_create_text_input(s.textInputManager); });
         constexpr int boundAtStart = 13;
-        row("wl_pointer", boundAtStart, [](ScriptedService &s) { wl_seat_get_pointer(s.seat); });
+        addRows<int, Make>({
+            {"wl_surface", 0, [](auto &s) { wl_compositor_create_surface(s.compositor); }},
+            {"wl_region", 0, [](auto &s) { wl_compositor_create_region(s.compositor); }},
+            {"wl_shm_pool", 0, [](auto &s) { s.makePool(4096); }},
+            {"wl_buffer", 0, [](auto &s) { s.makeBuffer(2, 2, 0); }},
+            {"wl_callback", 0,
+             [](auto &s) {
+                 if (!s.surface)
+                     s.surface = wl_compositor_create_surface(s.compositor);
+                 wl_surface_frame(s.surface);
+             }},
+            {"xdg_popup", 0, makePopup},
+            {"wl_data_source", 0, [](auto &s) { wl_data_device_manager_create_data_source(s.dataDeviceManager); }},
+            {"zwp_text_input_v1", 1, [](auto &s) { zwp_text_input_manager_v1_create_text_input(s.textInputManager); }},
+            {"wl_pointer", boundAtStart, [](auto &s) { wl_seat_get_pointer(s.seat); }},
+        });
     }
     void objectsAreCounted()
     {
-        QFETCH(std::string, interface);
-        QFETCH(int, alreadyThere);
-        QFETCH(Make, make);
+        const auto [alreadyThere, make] = row<int, Make>();
+        const std::string interface = QTest::currentDataTag();
         PresentedPair pair;
         const int limit = static_cast<int>(limitOf(interface));
         for (int i = alreadyThere; i < limit; ++i) {
@@ -115,8 +117,7 @@ private Q_SLOTS:
         make(pair.service);
         pair.exchange();
         QCOMPARE(pair.protocolError(), std::string("favrin_remote_view_v1 6"));
-        QCOMPARE(pair.delegate.closes.size(), std::size_t(1));
-        QVERIFY(pair.delegate.closes[0].reason == CloseReason::LimitExceeded);
+        QVERIFY(pair.delegate.isClosedFor(CloseReason::LimitExceeded));
         QVERIFY(pair.delegate.closes[0].detail.find(interface) != std::string::npos);
     }
 
@@ -175,7 +176,7 @@ private Q_SLOTS:
         QVERIFY(pair.delegate.closes.empty());
         wl_data_source_offer(source, "one/more");
         pair.exchange();
-        QVERIFY(pair.delegate.closes.at(0).reason == CloseReason::LimitExceeded);
+        QVERIFY(pair.delegate.isClosedFor(CloseReason::LimitExceeded));
     }
 
     void preparationsOfTheHostAreCounted()
@@ -190,86 +191,70 @@ private Q_SLOTS:
 
     void malformedBytesEndTheConnection_data()
     {
-        QTest::addColumn<Words>("words");
-        QTest::addColumn<std::string>("detail");
-        QTest::newRow("unknown object") << request(77, 0, 8) << std::string("wl_display error 0");
-        QTest::newRow("unknown request") << request(1, 9, 8) << std::string("wl_display error 1");
-        QTest::newRow("argument missing") << request(1, 1, 8) << std::string("wl_display error 1");
-        QTest::newRow("null where an object must be") << request(1, 1, 12, {0}) << std::string("wl_display error");
-        QTest::newRow("id of the server") << request(1, 1, 12, {0xff000000}) << std::string("wl_display error");
-        QTest::newRow("id with a gap") << request(1, 1, 12, {99}) << std::string("wl_display error");
-        QTest::newRow("size of zero") << request(1, 1, 0) << std::string("wl_display error 1");
         Words tooLong = request(1, 1, 65532);
         tooLong.resize(4096);
-        QTest::newRow("larger than a message may be") << tooLong << std::string();
+        addRows<Words, std::string>({
+            {"unknown object", request(77, 0, 8), "wl_display error 0"},
+            {"unknown request", request(1, 9, 8), "wl_display error 1"},
+            {"argument missing", request(1, 1, 8), "wl_display error 1"},
+            {"null where an object must be", request(1, 1, 12, {0}), "wl_display error"},
+            {"id of the server", request(1, 1, 12, {0xff000000}), "wl_display error"},
+            {"id with a gap", request(1, 1, 12, {99}), "wl_display error"},
+            {"size of zero", request(1, 1, 0), "wl_display error 1"},
+            {"larger than a message may be", tooLong, ""},
+        });
     }
     void malformedBytesEndTheConnection()
     {
-        QFETCH(Words, words);
-        QFETCH(std::string, detail);
-        RecordingDelegate delegate;
-        RemoteViewServer server(delegate);
-        const int descriptor = server.openConnection();
-        ::fcntl(descriptor, F_SETFL, O_NONBLOCK);
-        static_cast<void>(!::write(descriptor, words.data(), words.size() * 4));
-        for (int i = 0; i < 8; ++i)
-            server.dispatch();
-        ::close(descriptor);
-        QCOMPARE(delegate.closes.size(), std::size_t(1));
-        QVERIFY(delegate.closes[0].reason == CloseReason::ProtocolError);
-        QVERIFY2(delegate.closes[0].detail.starts_with(detail), delegate.closes[0].detail.c_str());
+        const auto [words, detail] = row<Words, std::string>();
+        Raw raw;
+        ::fcntl(raw.descriptor, F_SETFL, O_NONBLOCK);
+        static_cast<void>(!::write(raw.descriptor, words.data(), words.size() * 4));
+        raw.dispatch(8);
+        ::close(raw.descriptor);
+        QVERIFY(raw.delegate.isClosedFor(CloseReason::ProtocolError));
+        QVERIFY2(raw.delegate.closes[0].detail.starts_with(detail), raw.delegate.closes[0].detail.c_str());
     }
 
     void halfAMessageAndStrayFilesAreHarmless()
     {
-        RecordingDelegate delegate;
-        RemoteViewServer server(delegate);
-        const int descriptor = server.openConnection();
+        Raw raw;
         // Two bytes of eight, and a file that no request asks for.
         const std::uint16_t half = 1;
-        sendFiles<std::uint16_t>(descriptor, {&half, 1}, descriptor, 1);
-        server.dispatch();
-        server.dispatch();
-        QVERIFY(delegate.closes.empty());
-        ::close(descriptor);
+        sendFiles<std::uint16_t>(raw.descriptor, {&half, 1}, raw.descriptor, 1);
+        raw.dispatch(2);
+        QVERIFY(raw.delegate.closes.empty());
+        ::close(raw.descriptor);
     }
 
     void aServiceThatDiesBeforeItIsReadHasBrokenNoRule()
     {
-        RecordingDelegate delegate;
-        RemoteViewServer server(delegate);
-        const int descriptor = server.openConnection();
+        Raw raw;
         Words all;
         for (std::uint32_t id = 2; id < 1000; ++id) {
             const auto words = request(1, 0, 12, {id});
             all.insert(all.end(), words.begin(), words.end());
         }
-        QCOMPARE(::write(descriptor, all.data(), all.size() * 4), ssize_t(all.size() * 4));
-        ::close(descriptor);
-        for (int i = 0; i < 8; ++i)
-            server.dispatch();
-        QCOMPARE(delegate.closes.size(), std::size_t(1));
-        QVERIFY(delegate.closes[0].reason == CloseReason::ServiceGone);
+        QCOMPARE(::write(raw.descriptor, all.data(), all.size() * 4), ssize_t(all.size() * 4));
+        ::close(raw.descriptor);
+        raw.dispatch(8);
+        QVERIFY(raw.delegate.isClosedFor(CloseReason::ServiceGone));
     }
 
     void filesThatNoRequestAsksForAreCounted()
     {
-        RecordingDelegate delegate;
-        RemoteViewServer server(delegate);
-        const int descriptor = server.openConnection();
-        const int before = OpenFiles::count();
+        Raw raw;
+        const int before = openFiles();
         int most = 0;
-        for (std::uint32_t id = 2; id < 100 && delegate.closes.empty(); ++id) {
-            const auto words = request(1, 0, 12, {id});
-            sendFiles<std::uint32_t>(descriptor, words, descriptor, 28);
-            server.dispatch();
-            most = std::max(most, OpenFiles::count() - before);
+        for (std::uint32_t id = 2; id < 100 && raw.delegate.closes.empty(); ++id) {
+            sendFiles<std::uint32_t>(raw.descriptor, request(1, 0, 12, {id}), raw.descriptor, 28);
+            raw.dispatch(1);
+            most = std::max(most, openFiles() - before);
         }
-        QCOMPARE(delegate.closes.size(), std::size_t(1));
-        QVERIFY(delegate.closes[0].reason == CloseReason::LimitExceeded);
+        QVERIFY(raw.delegate.isClosedFor(CloseReason::LimitExceeded));
         // Those of one more message than may be.
         QVERIFY2(most <= static_cast<int>(limits::strayFiles) + 28, std::to_string(most).c_str());
-        ::close(descriptor);
+        ::close(raw.descriptor);
     }
 
     void aFloodIsTakenInSmallPortions()
@@ -287,9 +272,6 @@ private Q_SLOTS:
         pair.exchange();
         QCOMPARE(static_cast<int>(pair.delegate.calls.size()) - before, 2000);
     }
-
-private:
-    OpenFiles m_files;
 };
 
 QTEST_GUILESS_MAIN(ServerLimitsTest)

@@ -202,7 +202,7 @@ private Q_SLOTS:
         });
         QVERIFY(healthy.closes.empty());
         QCOMPARE(healthy.picks.size(), std::size_t(3));
-        QCOMPARE(healthy.calls.back(), std::string("finish"));
+        QCOMPARE(healthy.calls.back(), QStringLiteral("finish"));
 
         const auto filesBefore = QDir(QStringLiteral("/proc/self/fd")).count();
         std::mt19937 random(seed);

@@ -6,36 +6,31 @@
 
 #include <fcntl.h>
 
+using namespace Qt::StringLiterals;
 using Lines = std::vector<std::string>;
 using Start = PresentedPair::Start;
 using favrin::host::server::TextInputState;
 
 namespace {
 
-std::string readAll(int descriptor)
+/** To read from, and to write to. */
+std::array<int, 2> openPipe()
 {
-    std::string text;
-    std::array<char, 64> buffer = {};
-    for (ssize_t got = 0; (got = ::read(descriptor, buffer.data(), buffer.size())) > 0;)
-        text.append(buffer.data(), std::size_t(got));
-    ::close(descriptor);
-    return text;
+    std::array<int, 2> ends = {-1, -1};
+    static_cast<void>(!::pipe2(ends.data(), O_CLOEXEC));
+    return ends;
+}
+
+QByteArray readAll(int descriptor)
+{
+    QFile file;
+    return file.open(descriptor, QIODevice::ReadOnly, QFile::AutoCloseHandle) ? file.readAll() : QByteArray("nothing");
 }
 
 wl_data_source *makeSource(ScriptedService &service, const Lines &types)
 {
-    static const wl_data_source_listener listener = [] {
-        wl_data_source_listener l = {};
-        l.send = [](void *data, wl_data_source *, const char *type, std::int32_t descriptor) {
-            static_cast<ScriptedService *>(data)->note(std::string("send ") + type);
-            static_cast<void>(!::write(descriptor, "service", 7));
-            ::close(descriptor);
-        };
-        l.cancelled = [](void *data, wl_data_source *) { static_cast<ScriptedService *>(data)->note("cancelled"); };
-        return l;
-    }();
     wl_data_source *source = wl_data_device_manager_create_data_source(service.dataDeviceManager);
-    wl_data_source_add_listener(source, &listener, &service);
+    service.listenTo(source);
     for (const std::string &type : types)
         wl_data_source_offer(source, type.c_str());
     return source;
@@ -43,14 +38,11 @@ wl_data_source *makeSource(ScriptedService &service, const Lines &types)
 
 } // namespace
 
-class ServerTextAndClipboardTest : public QObject
+class ServerTextAndClipboardTest : public ServerTest
 {
     Q_OBJECT
 
 private Q_SLOTS:
-    void init() { m_files.remember(); }
-    void cleanup() { m_files.check(); }
-
     void aTextFieldDescribesItself()
     {
         PresentedPair pair(Start::Mapped);
@@ -67,23 +59,20 @@ private Q_SLOTS:
         zwp_text_input_v1_set_surrounding_text(input, "\xff", 0, 0);
         zwp_text_input_v1_set_preferred_language(input, "\xff");
         pair.exchange();
-        QCOMPARE(pair.delegate.textInputs.size(), std::size_t(1));
-        const TextInputState &state = pair.delegate.textInputs[0];
-        QVERIFY(state.enabled);
-        QCOMPARE(state.surroundingText, std::string("aéz"));
-        QCOMPARE(state.cursor, 4u);
-        QCOMPARE(state.anchor, 1u);
-        QCOMPARE(state.contentHints, 0x80u);
-        QCOMPARE(state.contentPurpose, 3u);
-        QCOMPARE(state.cursorRectangle.height, 4);
-        QCOMPARE(state.preferredLanguage, std::string("cs"));
-        QVERIFY(state.wantsInputPanel);
-        QCOMPARE(state.resets, 1u);
-
+        QCOMPARE(pair.delegate.textInputs, (std::vector{TextInputState{.enabled = true,
+                                                                       .surroundingText = "aéz",
+                                                                       .cursor = 4,
+                                                                       .anchor = 1,
+                                                                       .contentPurpose = 3,
+                                                                       .contentHints = 0x80,
+                                                                       .cursorRectangle = {1, 2, 3, 4},
+                                                                       .preferredLanguage = "cs",
+                                                                       .wantsInputPanel = true,
+                                                                       .resets = 1}}));
         zwp_text_input_v1_deactivate(input, pair.service.seat);
         pair.exchange();
         QVERIFY(!pair.delegate.textInputs.back().enabled);
-        QCOMPARE(pair.service.eventsOf("text"), (Lines{"text enter", "text panel 1", "text leave"}));
+        QCOMPARE(pair.heard("text"), u"enter, input_panel_state 1, leave"_s);
     }
 
     void theInputMethodWritesIntoTheActiveField()
@@ -102,8 +91,8 @@ private Q_SLOTS:
         pair.server.deleteSurroundingText(99, 99);
         pair.server.deleteSurroundingText(0, 0);
         pair.exchange();
-        QCOMPARE(pair.service.eventsOf("text"), (Lines{"text cursor 4", "text preedit 7 pré pré", "text commit 7 é",
-                                                       "text delete -4 6", "text commit 7 "}));
+        QCOMPARE(pair.heard("text"), u"preedit_cursor 4, preedit_string 7 pré pré, commit_string 7 é, "
+                                     "delete_surrounding_text -4 6, commit_string 7 "_s);
 
         // A long text comes in parts that end between characters, and is cut in the end.
         pair.service.events.clear();
@@ -113,8 +102,8 @@ private Q_SLOTS:
         pair.server.commitText(longText);
         pair.exchange();
         std::string received;
-        for (const std::string &event : pair.service.eventsOf("text commit 7 "))
-            received += event.substr(14);
+        for (const std::string &event : pair.service.eventsOf("text commit_string 7 "))
+            received += event.substr(21);
         QCOMPARE(received.size(), favrin::host::server::limits::inputTextBytes - 1);
         QVERIFY(longText.starts_with(received));
     }
@@ -133,19 +122,17 @@ private Q_SLOTS:
         QCOMPARE(offered[1], std::string("offer type/0"));
 
         pair.delegate.calls.clear();
-        std::array<int, 2> wanted = {};
-        std::array<int, 2> unknown = {};
-        QCOMPARE(::pipe2(wanted.data(), O_CLOEXEC), 0);
-        QCOMPARE(::pipe2(unknown.data(), O_CLOEXEC), 0);
+        const auto wanted = openPipe();
+        const auto unknown = openPipe();
         wl_data_offer_receive(pair.service.dataOffer, "text/plain", wanted[1]);
         wl_data_offer_receive(pair.service.dataOffer, "no/such", unknown[1]);
         pair.service.flush();
         ::close(wanted[1]);
         ::close(unknown[1]);
         pair.exchange();
-        QCOMPARE(pair.delegate.calls, Lines{"wants text/plain"});
-        QCOMPARE(readAll(wanted[0]), std::string("host"));
-        QCOMPARE(readAll(unknown[0]), std::string());
+        QCOMPARE(pair.told(), u"wants text/plain"_s);
+        QCOMPARE(readAll(wanted[0]), QByteArray("host"));
+        QCOMPARE(readAll(unknown[0]), QByteArray());
 
         pair.server.setClipboard({});
         pair.exchange();
@@ -185,16 +172,14 @@ private Q_SLOTS:
         pair.exchange();
         QCOMPARE(pair.delegate.offers, (std::vector<Lines>{{"text/plain", "text/html"}}));
 
-        std::array<int, 2> known = {};
-        std::array<int, 2> unknown = {};
-        QCOMPARE(::pipe2(known.data(), O_CLOEXEC), 0);
-        QCOMPARE(::pipe2(unknown.data(), O_CLOEXEC), 0);
+        const auto known = openPipe();
+        const auto unknown = openPipe();
         pair.server.requestServiceClipboard("text/html", known[1]);
         pair.server.requestServiceClipboard("no/such", unknown[1]);
         pair.exchange();
-        QCOMPARE(pair.service.eventsOf("send"), Lines{"send text/html"});
-        QCOMPARE(readAll(known[0]), std::string("service"));
-        QCOMPARE(readAll(unknown[0]), std::string());
+        QCOMPARE(pair.heard("send"), u"text/html"_s);
+        QCOMPARE(readAll(known[0]), QByteArray("service"));
+        QCOMPARE(readAll(unknown[0]), QByteArray());
 
         // The host's clipboard takes its place.
         pair.server.setClipboard({"text/plain"});
@@ -202,9 +187,6 @@ private Q_SLOTS:
         QCOMPARE(pair.service.eventsOf("cancelled").size(), std::size_t(2));
         QCOMPARE(pair.delegate.offers.size(), std::size_t(1));
     }
-
-private:
-    OpenFiles m_files;
 };
 
 QTEST_GUILESS_MAIN(ServerTextAndClipboardTest)
