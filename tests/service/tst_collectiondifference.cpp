@@ -43,34 +43,31 @@ class TestCollectionDifference : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void theScriptIsRightAndShortest();
-    void longListsNeedNoQuadraticMemory();
-};
-
-void TestCollectionDifference::theScriptIsRightAndShortest()
-{
-    std::mt19937 random(20240817);
-    for (int round = 0; round < 20000; ++round) {
-        const std::size_t values = 1 + random() % 6;
-        const List before = randomList(random, 14, values);
-        const List after = randomList(random, 14, values);
-        const auto script = differenceOfIdentities(before, after);
-        QVERIFY(std::ranges::is_sorted(script.removals) && std::ranges::is_sorted(script.insertions));
-        QCOMPARE(without(before, script.removals), without(after, script.insertions));
-        QCOMPARE(script.removals.size() + script.insertions.size(),
-                 before.size() + after.size() - 2 * commonLength(before, after));
+    void theScriptIsRightAndShortest()
+    {
+        std::mt19937 random(20240817);
+        for (int round = 0; round < 20000; ++round) {
+            const std::size_t values = 1 + random() % 6;
+            const List before = randomList(random, 14, values);
+            const List after = randomList(random, 14, values);
+            const auto script = differenceOfIdentities(before, after);
+            QVERIFY(std::ranges::is_sorted(script.removals) && std::ranges::is_sorted(script.insertions));
+            QCOMPARE(without(before, script.removals), without(after, script.insertions));
+            QCOMPARE(script.removals.size() + script.insertions.size(),
+                     before.size() + after.size() - 2 * commonLength(before, after));
+        }
     }
-}
 
-void TestCollectionDifference::longListsNeedNoQuadraticMemory()
-{
-    List before(10000);
-    std::iota(before.begin(), before.end(), 0);
-    List reversed(before.rbegin(), before.rend());
-    QCOMPARE(differenceOfIdentities(before, reversed).removals.size(), before.size() - 1);
-    List shorter = without(before, {5000});
-    QCOMPARE(differenceOfIdentities(before, shorter), (CollectionDifference{{5000}, {}}));
-}
+    void longListsNeedNoQuadraticMemory()
+    {
+        List before(10000);
+        std::iota(before.begin(), before.end(), 0);
+        List reversed(before.rbegin(), before.rend());
+        QCOMPARE(differenceOfIdentities(before, reversed).removals.size(), before.size() - 1);
+        List shorter = without(before, {5000});
+        QCOMPARE(differenceOfIdentities(before, shorter), (CollectionDifference{{5000}, {}}));
+    }
+};
 
 QTEST_GUILESS_MAIN(TestCollectionDifference)
 #include "tst_collectiondifference.moc"

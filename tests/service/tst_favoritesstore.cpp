@@ -21,6 +21,7 @@ using platform::Bytes;
 using platform::DefaultsArray;
 using platform::DefaultsValue;
 using ColorList = FavoritesStore::ColorList;
+using namespace Qt::StringLiterals;
 
 namespace {
 
@@ -124,204 +125,186 @@ class TestFavoritesStore : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void init();
+    void init()
+    {
+        const QString file = m_folder.filePath(u"%1.sqlite"_s.arg(m_files++));
+        m_defaults = std::make_unique<platform::UserDefaults>(file.toStdString());
+    }
     void cleanup() { m_defaults.reset(); }
 
-    void theFirstRunStoresTheDefaultsOfTheDisplay();
-    void anEmptyListStaysEmpty();
-    void onlyFullyOpaqueColorsAreShownWithoutAlpha();
-    void editsWithoutAlphaAreMerged_data();
-    void editsWithoutAlphaAreMerged();
-    void randomEditsWithoutAlphaKeepWhatTheyDidNotSee();
-    void aSingleRemovalOrAdditionHasOneOutcome();
-    void whatCannotBeReadReadsAsNoneAndIsPutAsideOnce_data();
-    void whatCannotBeReadReadsAsNoneAndIsPutAsideOnce();
-    void aTextUnderTheKeyGivesWayToTheDefaults();
-    void severalUnreadableValuesAreAllKept();
-    void mergingSeesWhatAnotherPickerSaved();
-    void aListThatCannotBeWrittenLeavesTheStoredOne();
+    void theFirstRunStoresTheDefaultsOfTheDisplay()
+    {
+        using Rows = std::array<std::array<int, 3>, 5>;
+        constexpr Rows sRGB = {{{0, 0, 0}, {0, 97, 253}, {51, 199, 89}, {255, 204, 1}, {255, 58, 47}}};
+        constexpr Rows wide = {{{0, 0, 0}, {40, 95, 244}, {100, 196, 102}, {247, 206, 70}, {235, 77, 61}}};
+        const auto space = isWideGamut() ? SomeColor::ColorSpace::displayP3 : SomeColor::ColorSpace::sRGB;
+        ColorList expected;
+        for (const auto &row : isWideGamut() ? wide : sRGB)
+            expected.emplace_back(row[0] / 255.0, row[1] / 255.0, row[2] / 255.0, 1.0, space);
+        const FavoritesStore store(*m_defaults);
+        QCOMPARE(store.favoriteColors(true), expected);
+        QCOMPARE(m_defaults->bytes(key), encoded(expected));
+    }
+
+    void anEmptyListStaysEmpty()
+    {
+        m_defaults->set(key, bytes("[]"));
+        FavoritesStore store(*m_defaults);
+        QVERIFY(store.favoriteColors(true).empty());
+        store.saveFavoriteColors({}, true);
+        QVERIFY(!m_defaults->value(asideKey));
+    }
+
+    void onlyFullyOpaqueColorsAreShownWithoutAlpha()
+    {
+        ColorList list = colors("aBc");
+        list.push_back(list.front().setting(SomeColor::Component::a, 0.999));
+        m_defaults->set(key, encoded(list));
+        const FavoritesStore store(*m_defaults);
+        QCOMPARE(letters(store.favoriteColors(false)), u"ac"_s);
+        QCOMPARE(store.favoriteColors(true), list);
+    }
+
+    void editsWithoutAlphaAreMerged_data()
+    {
+        QTest::addColumn<QString>("stored");
+        QTest::addColumn<QString>("edited");
+        QTest::addColumn<QString>("merged");
+        const auto row = [](const char *name, const char *stored, const char *edited, const char *merged) {
+            QTest::newRow(name) << QString::fromLatin1(stored) << QString::fromLatin1(edited)
+                                << QString::fromLatin1(merged);
+        };
+        row("nothing changed", "aBc", "ac", "aBc");
+        row("one removed and one added", "aBc", "cd", "Bcd");
+        row("an addition comes after the translucent", "aB", "ax", "aBx");
+        row("an addition in front comes last too", "aB", "xa", "aBx");
+        row("the only opaque one removed", "BaC", "", "BC");
+        row("all new", "aBc", "xy", "Bxy");
+        row("one of two equal", "aa", "a", "a");
+        row("a translucent twin is not touched", "aA", "", "A");
+        row("a removed one between two equal others", "abBa", "aa", "aBa");
+        row("stored list empty", "", "ab", "ab");
+        row("both empty", "", "", "");
+    }
+    void editsWithoutAlphaAreMerged()
+    {
+        QFETCH(QString, stored);
+        QFETCH(QString, edited);
+        QFETCH(QString, merged);
+        m_defaults->set(key, encoded(colors(stored.toLatin1().constData())));
+        FavoritesStore store(*m_defaults);
+        store.saveFavoriteColors(colors(edited.toLatin1().constData()), false);
+        QCOMPARE(letters(store.favoriteColors(true)), merged);
+
+        store.saveFavoriteColors(colors(edited.toLatin1().constData()), true);
+        QCOMPARE(letters(store.favoriteColors(true)), edited);
+    }
+
+    void randomEditsWithoutAlphaKeepWhatTheyDidNotSee()
+    {
+        std::mt19937 random(77);
+        for (int round = 0; round < 3000; ++round) {
+            const ColorList stored = randomColors(random, "abcdABCD", 12);
+            const ColorList edited = randomColors(random, "abcde", 9);
+            const ColorList merged = mergedFavorites(stored, edited);
+            QCOMPARE(letters(translucentColors(merged)), letters(translucentColors(stored)));
+            QVERIFY(std::ranges::includes(sortedLetters(merged), sortedLetters(edited)));
+        }
+    }
+
+    void aSingleRemovalOrAdditionHasOneOutcome()
+    {
+        std::mt19937 random(78);
+        for (int round = 0; round < 3000; ++round) {
+            const ColorList stored = randomColors(random, "abcABC", 12);
+            ColorList visible = opaqueColors(stored);
+
+            ColorList added = visible;
+            const auto place = static_cast<std::ptrdiff_t>(random() % (visible.size() + 1));
+            added.insert(added.begin() + place, colors("x").front());
+            QCOMPARE(letters(mergedFavorites(stored, added)), letters(stored) + u"x"_s);
+
+            if (visible.empty())
+                continue;
+            visible.erase(visible.begin() + static_cast<std::ptrdiff_t>(random() % visible.size()));
+            const ColorList removed = mergedFavorites(stored, visible);
+            QCOMPARE(letters(opaqueColors(removed)), letters(visible));
+            QCOMPARE(letters(translucentColors(removed)), letters(translucentColors(stored)));
+            QVERIFY(keepsOrder(removed, stored));
+        }
+    }
+
+    void whatCannotBeReadReadsAsNoneAndIsPutAsideOnce_data()
+    {
+        QTest::addColumn<int>("index");
+        int index = 0;
+        for (const NamedValue &row : unreadableValues())
+            QTest::newRow(row.name) << index++;
+    }
+    void whatCannotBeReadReadsAsNoneAndIsPutAsideOnce()
+    {
+        QFETCH(int, index);
+        const DefaultsValue stored = unreadableValues()[static_cast<std::size_t>(index)].value;
+        FavoritesStore store(*m_defaults);
+        for (const bool replacingAll : {true, false}) {
+            m_defaults->set(key, stored);
+            QVERIFY(store.favoriteColors(true).empty());
+            // Nor are the defaults written over it.
+            QVERIFY(m_defaults->value(key) == stored);
+            QTest::ignoreMessage(QtWarningMsg, putAsideWarning);
+            store.saveFavoriteColors(colors("a"), replacingAll);
+            QCOMPARE(letters(store.favoriteColors(true)), u"a"_s);
+            QVERIFY(m_defaults->array(asideKey) == DefaultsArray{stored});
+        }
+    }
+
+    void aTextUnderTheKeyGivesWayToTheDefaults()
+    {
+        m_defaults->set(key, std::string("text"));
+        QTest::ignoreMessage(QtWarningMsg, putAsideWarning);
+        const FavoritesStore store(*m_defaults);
+        QCOMPARE(store.favoriteColors(true).size(), std::size_t(5));
+        QVERIFY(m_defaults->array(asideKey) == DefaultsArray{std::string("text")});
+    }
+
+    void severalUnreadableValuesAreAllKept()
+    {
+        FavoritesStore store(*m_defaults);
+        DefaultsArray expected;
+        for (int number = 0; number < 20; ++number) {
+            const Bytes damaged = bytes("damaged " + std::to_string(number));
+            expected.push_back(damaged);
+            m_defaults->set(key, damaged);
+            QTest::ignoreMessage(QtWarningMsg, putAsideWarning);
+            store.saveFavoriteColors({}, true);
+        }
+        expected.erase(expected.begin(), expected.end() - 16);
+        QVERIFY(m_defaults->array(asideKey) == expected);
+    }
+
+    void mergingSeesWhatAnotherPickerSaved()
+    {
+        m_defaults->set(key, encoded(colors("aB")));
+        FavoritesStore first(*m_defaults);
+        FavoritesStore second(*m_defaults);
+        second.saveFavoriteColors(colors("aBC"), true);
+        first.saveFavoriteColors(colors("ax"), false);
+        QCOMPARE(letters(second.favoriteColors(true)), u"aBCx"_s);
+    }
+
+    void aListThatCannotBeWrittenLeavesTheStoredOne()
+    {
+        m_defaults->set(key, encoded(colors("ab")));
+        FavoritesStore store(*m_defaults);
+        store.saveFavoriteColors({SomeColor(0, 0, 0, qQNaN(), SomeColor::ColorSpace::sRGB)}, true);
+        QCOMPARE(letters(store.favoriteColors(true)), u"ab"_s);
+    }
 
 private:
     QTemporaryDir m_folder;
     int m_files = 0;
     std::unique_ptr<platform::UserDefaults> m_defaults;
 };
-
-void TestFavoritesStore::init()
-{
-    const QString file = m_folder.filePath(QStringLiteral("%1.sqlite").arg(m_files++));
-    m_defaults = std::make_unique<platform::UserDefaults>(file.toStdString());
-}
-
-void TestFavoritesStore::theFirstRunStoresTheDefaultsOfTheDisplay()
-{
-    using Rows = std::array<std::array<int, 3>, 5>;
-    constexpr Rows sRGB = {{{0, 0, 0}, {0, 97, 253}, {51, 199, 89}, {255, 204, 1}, {255, 58, 47}}};
-    constexpr Rows wide = {{{0, 0, 0}, {40, 95, 244}, {100, 196, 102}, {247, 206, 70}, {235, 77, 61}}};
-    const auto space = isWideGamut() ? SomeColor::ColorSpace::displayP3 : SomeColor::ColorSpace::sRGB;
-    ColorList expected;
-    for (const auto &row : isWideGamut() ? wide : sRGB)
-        expected.emplace_back(row[0] / 255.0, row[1] / 255.0, row[2] / 255.0, 1.0, space);
-    const FavoritesStore store(*m_defaults);
-    QCOMPARE(store.favoriteColors(true), expected);
-    QCOMPARE(m_defaults->bytes(key), encoded(expected));
-}
-
-void TestFavoritesStore::anEmptyListStaysEmpty()
-{
-    m_defaults->set(key, bytes("[]"));
-    FavoritesStore store(*m_defaults);
-    QVERIFY(store.favoriteColors(true).empty());
-    store.saveFavoriteColors({}, true);
-    QVERIFY(!m_defaults->value(asideKey));
-}
-
-void TestFavoritesStore::onlyFullyOpaqueColorsAreShownWithoutAlpha()
-{
-    ColorList list = colors("aBc");
-    list.push_back(list.front().setting(SomeColor::Component::a, 0.999));
-    m_defaults->set(key, encoded(list));
-    const FavoritesStore store(*m_defaults);
-    QCOMPARE(letters(store.favoriteColors(false)), QStringLiteral("ac"));
-    QCOMPARE(store.favoriteColors(true), list);
-}
-
-void TestFavoritesStore::editsWithoutAlphaAreMerged_data()
-{
-    QTest::addColumn<QString>("stored");
-    QTest::addColumn<QString>("edited");
-    QTest::addColumn<QString>("merged");
-    const auto row = [](const char *name, const char *stored, const char *edited, const char *merged) {
-        QTest::newRow(name) << QString::fromLatin1(stored) << QString::fromLatin1(edited)
-                            << QString::fromLatin1(merged);
-    };
-    row("nothing changed", "aBc", "ac", "aBc");
-    row("one removed and one added", "aBc", "cd", "Bcd");
-    row("an addition comes after the translucent", "aB", "ax", "aBx");
-    row("an addition in front comes last too", "aB", "xa", "aBx");
-    row("the only opaque one removed", "BaC", "", "BC");
-    row("all new", "aBc", "xy", "Bxy");
-    row("one of two equal", "aa", "a", "a");
-    row("a translucent twin is not touched", "aA", "", "A");
-    row("a removed one between two equal others", "abBa", "aa", "aBa");
-    row("stored list empty", "", "ab", "ab");
-    row("both empty", "", "", "");
-}
-
-void TestFavoritesStore::editsWithoutAlphaAreMerged()
-{
-    QFETCH(QString, stored);
-    QFETCH(QString, edited);
-    QFETCH(QString, merged);
-    m_defaults->set(key, encoded(colors(stored.toLatin1().constData())));
-    FavoritesStore store(*m_defaults);
-    store.saveFavoriteColors(colors(edited.toLatin1().constData()), false);
-    QCOMPARE(letters(store.favoriteColors(true)), merged);
-
-    store.saveFavoriteColors(colors(edited.toLatin1().constData()), true);
-    QCOMPARE(letters(store.favoriteColors(true)), edited);
-}
-
-void TestFavoritesStore::randomEditsWithoutAlphaKeepWhatTheyDidNotSee()
-{
-    std::mt19937 random(77);
-    for (int round = 0; round < 3000; ++round) {
-        const ColorList stored = randomColors(random, "abcdABCD", 12);
-        const ColorList edited = randomColors(random, "abcde", 9);
-        const ColorList merged = mergedFavorites(stored, edited);
-        QCOMPARE(letters(translucentColors(merged)), letters(translucentColors(stored)));
-        QVERIFY(std::ranges::includes(sortedLetters(merged), sortedLetters(edited)));
-    }
-}
-
-void TestFavoritesStore::aSingleRemovalOrAdditionHasOneOutcome()
-{
-    std::mt19937 random(78);
-    for (int round = 0; round < 3000; ++round) {
-        const ColorList stored = randomColors(random, "abcABC", 12);
-        ColorList visible = opaqueColors(stored);
-
-        ColorList added = visible;
-        const auto place = static_cast<std::ptrdiff_t>(random() % (visible.size() + 1));
-        added.insert(added.begin() + place, colors("x").front());
-        QCOMPARE(letters(mergedFavorites(stored, added)), letters(stored) + QStringLiteral("x"));
-
-        if (visible.empty())
-            continue;
-        visible.erase(visible.begin() + static_cast<std::ptrdiff_t>(random() % visible.size()));
-        const ColorList removed = mergedFavorites(stored, visible);
-        QCOMPARE(letters(opaqueColors(removed)), letters(visible));
-        QCOMPARE(letters(translucentColors(removed)), letters(translucentColors(stored)));
-        QVERIFY(keepsOrder(removed, stored));
-    }
-}
-
-void TestFavoritesStore::whatCannotBeReadReadsAsNoneAndIsPutAsideOnce_data()
-{
-    QTest::addColumn<int>("index");
-    int index = 0;
-    for (const NamedValue &row : unreadableValues())
-        QTest::newRow(row.name) << index++;
-}
-
-void TestFavoritesStore::whatCannotBeReadReadsAsNoneAndIsPutAsideOnce()
-{
-    QFETCH(int, index);
-    const DefaultsValue stored = unreadableValues()[static_cast<std::size_t>(index)].value;
-    FavoritesStore store(*m_defaults);
-    for (const bool replacingAll : {true, false}) {
-        m_defaults->set(key, stored);
-        QVERIFY(store.favoriteColors(true).empty());
-        // Nor are the defaults written over it.
-        QVERIFY(m_defaults->value(key) == stored);
-        QTest::ignoreMessage(QtWarningMsg, putAsideWarning);
-        store.saveFavoriteColors(colors("a"), replacingAll);
-        QCOMPARE(letters(store.favoriteColors(true)), QStringLiteral("a"));
-        QVERIFY(m_defaults->array(asideKey) == DefaultsArray{stored});
-    }
-}
-
-void TestFavoritesStore::aTextUnderTheKeyGivesWayToTheDefaults()
-{
-    m_defaults->set(key, std::string("text"));
-    QTest::ignoreMessage(QtWarningMsg, putAsideWarning);
-    const FavoritesStore store(*m_defaults);
-    QCOMPARE(store.favoriteColors(true).size(), std::size_t(5));
-    QVERIFY(m_defaults->array(asideKey) == DefaultsArray{std::string("text")});
-}
-
-void TestFavoritesStore::severalUnreadableValuesAreAllKept()
-{
-    FavoritesStore store(*m_defaults);
-    DefaultsArray expected;
-    for (int number = 0; number < 20; ++number) {
-        const Bytes damaged = bytes("damaged " + std::to_string(number));
-        expected.push_back(damaged);
-        m_defaults->set(key, damaged);
-        QTest::ignoreMessage(QtWarningMsg, putAsideWarning);
-        store.saveFavoriteColors({}, true);
-    }
-    expected.erase(expected.begin(), expected.end() - 16);
-    QVERIFY(m_defaults->array(asideKey) == expected);
-}
-
-void TestFavoritesStore::mergingSeesWhatAnotherPickerSaved()
-{
-    m_defaults->set(key, encoded(colors("aB")));
-    FavoritesStore first(*m_defaults);
-    FavoritesStore second(*m_defaults);
-    second.saveFavoriteColors(colors("aBC"), true);
-    first.saveFavoriteColors(colors("ax"), false);
-    QCOMPARE(letters(second.favoriteColors(true)), QStringLiteral("aBCx"));
-}
-
-void TestFavoritesStore::aListThatCannotBeWrittenLeavesTheStoredOne()
-{
-    m_defaults->set(key, encoded(colors("ab")));
-    FavoritesStore store(*m_defaults);
-    store.saveFavoriteColors({SomeColor(0, 0, 0, qQNaN(), SomeColor::ColorSpace::sRGB)}, true);
-    QCOMPARE(letters(store.favoriteColors(true)), QStringLiteral("ab"));
-}
 
 int main(int argc, char **argv)
 {
