@@ -4,6 +4,8 @@
 #include "remote/wireoptions.h"
 #include "remote/wiretext.h"
 
+#include "../shared/table.h"
+
 #include <QtTest>
 
 #include <bit>
@@ -41,8 +43,6 @@ platform::ColorSpace namelessSpace()
 
 } // namespace
 
-Q_DECLARE_METATYPE(std::vector<double>)
-
 class RemoteWireTest : public QObject
 {
     Q_OBJECT
@@ -50,27 +50,27 @@ class RemoteWireTest : public QObject
 private Q_SLOTS:
     void textIsWellFormed_data()
     {
-        QTest::addColumn<QByteArray>("text");
-        QTest::addColumn<bool>("isWellFormed");
-        QTest::newRow("empty") << QByteArray("") << true;
-        QTest::newRow("each length") << QByteArray("a\xc3\xa9\xe2\x82\xac\xf0\x9f\x8e\xa8") << true;
-        QTest::newRow("last character there is") << QByteArray("\xf4\x8f\xbf\xbf") << true;
-        QTest::newRow("one beyond it") << QByteArray("\xf4\x90\x80\x80") << false;
-        QTest::newRow("overlong slash") << QByteArray("\xc0\xaf") << false;
-        QTest::newRow("overlong in three") << QByteArray("\xe0\x9f\xbf") << false;
-        QTest::newRow("overlong in four") << QByteArray("\xf0\x8f\xbf\xbf") << false;
-        QTest::newRow("surrogate") << QByteArray("\xed\xa0\x80") << false;
-        QTest::newRow("follower alone") << QByteArray("\x80") << false;
-        QTest::newRow("cut short") << QByteArray("ab\xe2\x82") << false;
-        QTest::newRow("follower missing") << QByteArray("\xe2\x82z") << false;
-        QTest::newRow("zero inside") << QByteArray("a\0b", 3) << false;
-        QTest::newRow("not a lead byte") << QByteArray("\xff") << false;
+        addRows<QByteArray, bool>({
+            {"empty", "", true},
+            {"each length", "a\xc3\xa9\xe2\x82\xac\xf0\x9f\x8e\xa8", true},
+            {"last character there is", "\xf4\x8f\xbf\xbf", true},
+            {"one beyond it", "\xf4\x90\x80\x80", false},
+            {"overlong slash", "\xc0\xaf", false},
+            {"overlong in three", "\xe0\x9f\xbf", false},
+            {"overlong in four", "\xf0\x8f\xbf\xbf", false},
+            {"surrogate", "\xed\xa0\x80", false},
+            {"follower alone", "\x80", false},
+            {"cut short", "ab\xe2\x82", false},
+            {"follower missing", "\xe2\x82z", false},
+            {"zero inside", QByteArray("a\0b", 3), false},
+            {"not a lead byte", "\xff", false},
+        });
     }
     void textIsWellFormed()
     {
-        QFETCH(QByteArray, text);
-        QTEST(isWireText(text.toStdString()), "isWellFormed");
-        QTEST(sendableText(text.toStdString(), 100).has_value(), "isWellFormed");
+        const auto [text, isWellFormed] = row<QByteArray, bool>();
+        QCOMPARE(isWireText(text.toStdString()), isWellFormed);
+        QCOMPARE(sendableText(text.toStdString(), 100).has_value(), isWellFormed);
     }
 
     void cuttingKeepsCharactersWhole()
@@ -85,18 +85,16 @@ private Q_SLOTS:
 
     void aColorComesBackBitForBit_data()
     {
-        QTest::addColumn<QByteArray>("space");
-        QTest::addColumn<std::vector<double>>("components");
         constexpr double tiny = std::numeric_limits<double>::denorm_min();
-        QTest::newRow("Display P3") << QByteArray("kTQColorSpaceDisplayP3") << std::vector{0.1 + 0.2, 1.0 / 3, tiny};
-        QTest::newRow("extended, negative")
-            << QByteArray("kTQColorSpaceExtendedSRGB") << std::vector{-1.5, -0.0, 1.0e300};
-        QTest::newRow("gray") << QByteArray("kTQColorSpaceGray") << std::vector{0.7};
+        addRows<QByteArray, std::vector<double>>({
+            {"Display P3", "kTQColorSpaceDisplayP3", {0.1 + 0.2, 1.0 / 3, tiny}},
+            {"extended, negative", "kTQColorSpaceExtendedSRGB", {-1.5, -0.0, 1.0e300}},
+            {"gray", "kTQColorSpaceGray", {0.7}},
+        });
     }
     void aColorComesBackBitForBit()
     {
-        QFETCH(QByteArray, space);
-        QFETCH(std::vector<double>, components);
+        const auto [space, components] = row<QByteArray, std::vector<double>>();
         const Color color(platform::ColorSpace::named(space.toStdString()), components, 0.1);
         const auto wire = encodeColor(color);
         QCOMPARE(wire->numbers.size(), components.size() + 1);
@@ -130,19 +128,18 @@ private Q_SLOTS:
 
     void malformedArraysAreRefused_data()
     {
-        QTest::addColumn<std::vector<double>>("numbers");
-        QTest::addColumn<QByteArray>("space");
-        QTest::newRow("too short") << std::vector{0.0, 0.0, 1.0} << QByteArray("kTQColorSpaceSRGB");
-        QTest::newRow("too long") << std::vector{0.0, 0.0, 0.0, 0.0, 1.0} << QByteArray("kTQColorSpaceSRGB");
-        QTest::newRow("too long for gray") << std::vector{0.0, 0.0, 1.0} << QByteArray("kTQColorSpaceGray");
-        QTest::newRow("too short for an unknown space") << std::vector{0.0, 1.0} << QByteArray("noSuchSpace");
-        QTest::newRow("NaN") << std::vector{0.0, notANumber, 0.0, 1.0} << QByteArray("kTQColorSpaceSRGB");
-        QTest::newRow("infinite alpha") << std::vector{0.0, 0.0, 0.0, infinite} << QByteArray("kTQColorSpaceSRGB");
+        addRows<std::vector<double>, QByteArray>({
+            {"too short", {0.0, 0.0, 1.0}, "kTQColorSpaceSRGB"},
+            {"too long", {0.0, 0.0, 0.0, 0.0, 1.0}, "kTQColorSpaceSRGB"},
+            {"too long for gray", {0.0, 0.0, 1.0}, "kTQColorSpaceGray"},
+            {"too short for an unknown space", {0.0, 1.0}, "noSuchSpace"},
+            {"NaN", {0.0, notANumber, 0.0, 1.0}, "kTQColorSpaceSRGB"},
+            {"infinite alpha", {0.0, 0.0, 0.0, infinite}, "kTQColorSpaceSRGB"},
+        });
     }
     void malformedArraysAreRefused()
     {
-        QFETCH(std::vector<double>, numbers);
-        QFETCH(QByteArray, space);
+        const auto [numbers, space] = row<std::vector<double>, QByteArray>();
         QVERIFY(!decodeColor(bytesOf(numbers), space.toStdString()));
         QVERIFY(!decodeColorRun(bytesOf(numbers), space.toStdString()));
     }
@@ -205,24 +202,24 @@ private Q_SLOTS:
 
     void lengthsAreMadeSane_data()
     {
-        QTest::addColumn<double>("length");
-        QTest::addColumn<double>("sane");
-        QTest::newRow("usual") << 1024.5 << 1024.5;
-        QTest::newRow("largest") << 16384.0 << 16384.0;
-        QTest::newRow("beyond") << 16384.5 << 16384.0;
-        QTest::newRow("infinite") << infinite << 16384.0;
-        QTest::newRow("NaN") << notANumber << 0.0;
-        QTest::newRow("negative") << -1.0 << 0.0;
-        QTest::newRow("negative infinite") << -infinite << 0.0;
+        addRows<double, double>({
+            {"usual", 1024.5, 1024.5},
+            {"largest", 16384.0, 16384.0},
+            {"beyond", 16384.5, 16384.0},
+            {"infinite", infinite, 16384.0},
+            {"NaN", notANumber, 0.0},
+            {"negative", -1.0, 0.0},
+            {"negative infinite", -infinite, 0.0},
+        });
     }
     void lengthsAreMadeSane()
     {
-        QFETCH(double, length);
+        const auto [length, expected] = row<double, double>();
         const Configuration sane =
             sanitized(Configuration{.hostWindowWidth = length, .hostWindowHeight = length, .keyboardSpace = length});
-        QTEST(sane.hostWindowWidth, "sane");
-        QTEST(sane.hostWindowHeight, "sane");
-        QTEST(sane.keyboardSpace, "sane");
+        QCOMPARE(sane.hostWindowWidth, expected);
+        QCOMPARE(sane.hostWindowHeight, expected);
+        QCOMPARE(sane.keyboardSpace, expected);
     }
 
     void recordsAreMadeSane()

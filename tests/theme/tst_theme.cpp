@@ -1,6 +1,8 @@
 #include "service/displaycolor.h"
 #include "theme/theme.h"
 
+#include "../shared/table.h"
+
 #include <QSignalSpy>
 #include <QTest>
 
@@ -9,9 +11,6 @@
 using namespace favrin::theme;
 using favrin::service::ColorScheme;
 using favrin::service::DisplayColor;
-
-Q_DECLARE_METATYPE(favrin::service::ColorScheme)
-Q_DECLARE_METATYPE(favrin::theme::Contrast)
 
 namespace {
 
@@ -46,90 +45,78 @@ class ThemeTest : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void colorsCanBeReadOnTheBackground_data();
-    void colorsCanBeReadOnTheBackground();
-    void textGrowsUpToItsCap_data();
-    void textGrowsUpToItsCap();
-    void changesAreToldOnce();
-    void colorsFollowTheSurface();
+    void colorsCanBeReadOnTheBackground_data()
+    {
+        addRows<ColorScheme, Contrast>({
+            {"light", ColorScheme::Light, Contrast::Standard},
+            {"dark", ColorScheme::Dark, Contrast::Standard},
+            {"light, more contrast", ColorScheme::Light, Contrast::Increased},
+            {"dark, more contrast", ColorScheme::Dark, Contrast::Increased},
+        });
+    }
+    void colorsCanBeReadOnTheBackground()
+    {
+        const auto [scheme, contrast] = row<ColorScheme, Contrast>();
+        const SemanticColors colors = semanticColors(scheme, contrast);
+        const bool more = contrast == Contrast::Increased;
+        const auto ratio = [&colors](const QColor &color) { return contrastRatio(color, colors.systemBackground); };
+        QVERIFY(ratio(colors.label) >= 15.0);
+        QVERIFY(ratio(colors.secondaryLabel) >= (more ? 7.0 : 4.5));
+        QVERIFY(ratio(colors.tint) >= (more ? 7.0 : 4.5));
+        QVERIFY(ratio(colors.systemRed) >= (more ? 4.5 : 3.0));
+        QVERIFY(ratio(colors.systemGray) >= (more ? 4.5 : 3.0));
+        QVERIFY(contrastRatio(colors.secondaryLabel, over(colors.fill, colors.systemBackground)) >= 3.0);
+    }
+
+    void textGrowsUpToItsCap_data()
+    {
+        addRows<int, int, int, int>({
+            {"smallest", int(TextSizeCategory::ExtraSmall), 14, 11, 14},
+            {"default", int(TextSizeCategory::Large), 17, 13, 17},
+            {"cap of bar symbols", int(TextSizeCategory::ExtraLarge), 19, 15, 19},
+            {"cap of text", int(TextSizeCategory::ExtraExtraExtraLarge), 23, 19, 19},
+            {"largest", int(TextSizeCategory::AccessibilityExtraExtraExtraLarge), 23, 19, 19},
+            {"beyond the largest", 400, 23, 19, 19},
+            {"below the smallest", -1, 14, 11, 14},
+        });
+    }
+    void textGrowsUpToItsCap()
+    {
+        const auto [category, headline, footnote, barSymbol] = row<int, int, int, int>();
+        Theme &theme = Theme::instance();
+        theme.setTextSizeCategory(static_cast<TextSizeCategory>(category));
+        QCOMPARE(theme.headlineFont().pixelSize(), headline);
+        QCOMPARE(theme.footnoteFont().pixelSize(), footnote);
+        QCOMPARE(theme.barSymbolSize(), barSymbol);
+        theme.setTextSizeCategory(TextSizeCategory::Large);
+    }
+
+    void changesAreToldOnce()
+    {
+        Theme &theme = Theme::instance();
+        QSignalSpy colors(&theme, &Theme::colorsChanged);
+        theme.setColorScheme(ColorScheme::Dark);
+        theme.setColorScheme(ColorScheme::Dark);
+        QCOMPARE(colors.count(), 1);
+        QCOMPARE(theme.label(), QColor(Qt::white));
+        theme.setIncreaseContrast(true);
+        QCOMPARE(colors.count(), 2);
+        QCOMPARE(theme.systemBackground(), QColor(Qt::black));
+        theme.setIncreaseContrast(false);
+        theme.setColorScheme(ColorScheme::Light);
+    }
+
+    void colorsFollowTheSurface()
+    {
+        Theme &theme = Theme::instance();
+        const QColor before = theme.tint();
+        DisplayColor::instance().setSurfaceColorSpace(favrin::model::SomeColor::ColorSpace::displayP3);
+        QVERIFY(theme.tint() != before);
+        QCOMPARE(theme.secondaryLabel().alpha(), 0x99);
+        DisplayColor::instance().setSurfaceColorSpace(favrin::model::SomeColor::ColorSpace::sRGB);
+        QCOMPARE(theme.tint(), before);
+    }
 };
-
-void ThemeTest::colorsCanBeReadOnTheBackground_data()
-{
-    QTest::addColumn<ColorScheme>("scheme");
-    QTest::addColumn<Contrast>("contrast");
-    QTest::newRow("light") << ColorScheme::Light << Contrast::Standard;
-    QTest::newRow("dark") << ColorScheme::Dark << Contrast::Standard;
-    QTest::newRow("light, more contrast") << ColorScheme::Light << Contrast::Increased;
-    QTest::newRow("dark, more contrast") << ColorScheme::Dark << Contrast::Increased;
-}
-
-void ThemeTest::colorsCanBeReadOnTheBackground()
-{
-    QFETCH(ColorScheme, scheme);
-    QFETCH(Contrast, contrast);
-    const SemanticColors colors = semanticColors(scheme, contrast);
-    const bool more = contrast == Contrast::Increased;
-    const auto ratio = [&colors](const QColor &color) { return contrastRatio(color, colors.systemBackground); };
-    QVERIFY(ratio(colors.label) >= 15.0);
-    QVERIFY(ratio(colors.secondaryLabel) >= (more ? 7.0 : 4.5));
-    QVERIFY(ratio(colors.tint) >= (more ? 7.0 : 4.5));
-    QVERIFY(ratio(colors.systemRed) >= (more ? 4.5 : 3.0));
-    QVERIFY(ratio(colors.systemGray) >= (more ? 4.5 : 3.0));
-    QVERIFY(contrastRatio(colors.secondaryLabel, over(colors.fill, colors.systemBackground)) >= 3.0);
-}
-
-void ThemeTest::textGrowsUpToItsCap_data()
-{
-    QTest::addColumn<int>("category");
-    QTest::addColumn<int>("headline");
-    QTest::addColumn<int>("footnote");
-    QTest::addColumn<int>("barSymbol");
-    QTest::newRow("smallest") << int(TextSizeCategory::ExtraSmall) << 14 << 11 << 14;
-    QTest::newRow("default") << int(TextSizeCategory::Large) << 17 << 13 << 17;
-    QTest::newRow("cap of bar symbols") << int(TextSizeCategory::ExtraLarge) << 19 << 15 << 19;
-    QTest::newRow("cap of text") << int(TextSizeCategory::ExtraExtraExtraLarge) << 23 << 19 << 19;
-    QTest::newRow("largest") << int(TextSizeCategory::AccessibilityExtraExtraExtraLarge) << 23 << 19 << 19;
-    QTest::newRow("beyond the largest") << 400 << 23 << 19 << 19;
-    QTest::newRow("below the smallest") << -1 << 14 << 11 << 14;
-}
-
-void ThemeTest::textGrowsUpToItsCap()
-{
-    QFETCH(int, category);
-    Theme &theme = Theme::instance();
-    theme.setTextSizeCategory(static_cast<TextSizeCategory>(category));
-    QTEST(theme.headlineFont().pixelSize(), "headline");
-    QTEST(theme.footnoteFont().pixelSize(), "footnote");
-    QTEST(theme.barSymbolSize(), "barSymbol");
-    theme.setTextSizeCategory(TextSizeCategory::Large);
-}
-
-void ThemeTest::changesAreToldOnce()
-{
-    Theme &theme = Theme::instance();
-    QSignalSpy colors(&theme, &Theme::colorsChanged);
-    theme.setColorScheme(ColorScheme::Dark);
-    theme.setColorScheme(ColorScheme::Dark);
-    QCOMPARE(colors.count(), 1);
-    QCOMPARE(theme.label(), QColor(Qt::white));
-    theme.setIncreaseContrast(true);
-    QCOMPARE(colors.count(), 2);
-    QCOMPARE(theme.systemBackground(), QColor(Qt::black));
-    theme.setIncreaseContrast(false);
-    theme.setColorScheme(ColorScheme::Light);
-}
-
-void ThemeTest::colorsFollowTheSurface()
-{
-    Theme &theme = Theme::instance();
-    const QColor before = theme.tint();
-    DisplayColor::instance().setSurfaceColorSpace(favrin::model::SomeColor::ColorSpace::displayP3);
-    QVERIFY(theme.tint() != before);
-    QCOMPARE(theme.secondaryLabel().alpha(), 0x99);
-    DisplayColor::instance().setSurfaceColorSpace(favrin::model::SomeColor::ColorSpace::sRGB);
-    QCOMPARE(theme.tint(), before);
-}
 
 QTEST_MAIN(ThemeTest)
 #include "tst_theme.moc"
