@@ -9,7 +9,6 @@
 using namespace favrin::model;
 using Space = SomeColor::ColorSpace;
 
-
 namespace {
 
 const std::string blue = R"({"r":0,"g":0.3803921568627451,"b":0.9921568627450981,"a":1,)"
