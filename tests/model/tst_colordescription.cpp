@@ -2,6 +2,8 @@
 #include "model/somecolor.h"
 #include "platform/strings/localizedstring.h"
 
+#include "../shared/table.h"
+
 #include <QFile>
 #include <QHash>
 #include <QSet>
@@ -102,39 +104,21 @@ private Q_SLOTS:
 
     void names_data()
     {
-        QTest::addColumn<QString>("expected");
-        const auto row = [](const char *hex, const QString &expected) { QTest::newRow(hex) << expected; };
-        row("FFFFFF", u"white"_s);
-        row("EBEBEB", u"very light gray"_s);
-        row("ADADAD", u"light gray"_s);
-        row("858585", u"medium gray"_s);
-        row("474747", u"dark gray"_s);
-        row("333333", u"very dark gray"_s);
-        row("000000", u"black"_s);
-        row("FF0000", u"bright red"_s);
-        row("00FF00", u"bright green"_s);
-        row("0000FF", u"bright blue"_s);
-        row("FFFF00", u"bright yellow"_s);
-        row("00FFFF", u"bright cyan"_s);
-        row("FF00FF", u"bright magenta"_s);
-        row("FF6A00", u"bright orange"_s);
-        row("840000", u"dark red"_s);
-        row("033500", u"dark green"_s);
-        row("653700", u"medium brown"_s);
-        row("7E1E9C", u"medium purple"_s);
-        row("FFD1DF", u"light pink"_s);
-        row("FFD9A8", u"light peach"_s);
-        row("D1B26F", u"medium tan"_s);
-        row("011D57", u"dark navy blue"_s);
-        row("004D65", u"dark teal"_s);
-        row("DFEED4", u"very light green"_s);
-        row("52D6FC", u"light sky blue"_s);
-        row("D5B60A", u"dark yellow"_s);
-        row("66707A", u"medium bluish gray"_s);
+        addRows<QString>({
+            {"FFFFFF", u"white"_s},          {"EBEBEB", u"very light gray"_s}, {"ADADAD", u"light gray"_s},
+            {"858585", u"medium gray"_s},    {"474747", u"dark gray"_s},       {"333333", u"very dark gray"_s},
+            {"000000", u"black"_s},          {"FF0000", u"bright red"_s},      {"00FF00", u"bright green"_s},
+            {"0000FF", u"bright blue"_s},    {"FFFF00", u"bright yellow"_s},   {"00FFFF", u"bright cyan"_s},
+            {"FF00FF", u"bright magenta"_s}, {"FF6A00", u"bright orange"_s},   {"840000", u"dark red"_s},
+            {"033500", u"dark green"_s},     {"653700", u"medium brown"_s},    {"7E1E9C", u"medium purple"_s},
+            {"FFD1DF", u"light pink"_s},     {"FFD9A8", u"light peach"_s},     {"D1B26F", u"medium tan"_s},
+            {"011D57", u"dark navy blue"_s}, {"004D65", u"dark teal"_s},       {"DFEED4", u"very light green"_s},
+            {"52D6FC", u"light sky blue"_s}, {"D5B60A", u"dark yellow"_s},     {"66707A", u"medium bluish gray"_s},
+        });
     }
     void names()
     {
-        QFETCH(QString, expected);
+        const auto [expected] = row<QString>();
         QCOMPARE(nameOf(QString::fromLatin1(QTest::currentDataTag())), expected);
     }
 

@@ -51,30 +51,22 @@ private Q_SLOTS:
 
     void isParsed_data()
     {
-        QTest::addColumn<QString>("text");
-        QTest::addColumn<int>("red");
-        QTest::addColumn<int>("green");
-        QTest::addColumn<int>("blue");
-        const auto row = [](const QString &text, int red, int green, int blue) {
-            QTest::newRow(qPrintable(text)) << text << red << green << blue;
-        };
-        row(u"#0061FD"_s, 0, 97, 253);
-        row(u"0061fd"_s, 0, 97, 253);
-        row(u"#0061Fd"_s, 0, 97, 253);
-        row(u"#abc"_s, 170, 187, 204);
-        row(u"1g2!3z"_s, 1, 2, 3);
-        row(u" 1\t2\n3"_s, 1, 2, 3);
-        row(u"0xF0f0"_s, 0, 0xF0, 0xF0);
-        row(u"1é2345"_s, 1, 0x23, 0x45);
+        addRows<int, int, int>({
+            {"#0061FD", 0, 97, 253},
+            {"0061fd", 0, 97, 253},
+            {"#0061Fd", 0, 97, 253},
+            {"#abc", 170, 187, 204},
+            {"1g2!3z", 1, 2, 3},
+            {" 1\t2\n3", 1, 2, 3},
+            {"0xF0f0", 0, 0xF0, 0xF0},
+            {"1é2345", 1, 0x23, 0x45},
+        });
     }
     void isParsed()
     {
-        QFETCH(QString, text);
-        QFETCH(int, red);
-        QFETCH(int, green);
-        QFETCH(int, blue);
+        const auto [red, green, blue] = row<int, int, int>();
         HexColorError error = {"untouched", 7};
-        const auto color = parsed(text, Space::displayP3, &error);
+        const auto color = parsed(QString::fromUtf8(QTest::currentDataTag()), Space::displayP3, &error);
         QVERIFY(color);
         QVERIFY(*color == SomeColor(red / 255.0, green / 255.0, blue / 255.0, 1.0, Space::displayP3));
         QCOMPARE(error.code, 7);

@@ -6,6 +6,8 @@
 #include "service/favoritesmerge.h"
 #include "service/favoritesstore.h"
 
+#include "../shared/table.h"
+
 #include <QTemporaryDir>
 #include <QTest>
 
@@ -167,37 +169,30 @@ private Q_SLOTS:
 
     void editsWithoutAlphaAreMerged_data()
     {
-        QTest::addColumn<QString>("stored");
-        QTest::addColumn<QString>("edited");
-        QTest::addColumn<QString>("merged");
-        const auto row = [](const char *name, const char *stored, const char *edited, const char *merged) {
-            QTest::newRow(name) << QString::fromLatin1(stored) << QString::fromLatin1(edited)
-                                << QString::fromLatin1(merged);
-        };
-        row("nothing changed", "aBc", "ac", "aBc");
-        row("one removed and one added", "aBc", "cd", "Bcd");
-        row("an addition comes after the translucent", "aB", "ax", "aBx");
-        row("an addition in front comes last too", "aB", "xa", "aBx");
-        row("the only opaque one removed", "BaC", "", "BC");
-        row("all new", "aBc", "xy", "Bxy");
-        row("one of two equal", "aa", "a", "a");
-        row("a translucent twin is not touched", "aA", "", "A");
-        row("a removed one between two equal others", "abBa", "aa", "aBa");
-        row("stored list empty", "", "ab", "ab");
-        row("both empty", "", "", "");
+        addRows<QByteArray, QByteArray, QByteArray>({
+            {"nothing changed", "aBc", "ac", "aBc"},
+            {"one removed and one added", "aBc", "cd", "Bcd"},
+            {"an addition comes after the translucent", "aB", "ax", "aBx"},
+            {"an addition in front comes last too", "aB", "xa", "aBx"},
+            {"the only opaque one removed", "BaC", "", "BC"},
+            {"all new", "aBc", "xy", "Bxy"},
+            {"one of two equal", "aa", "a", "a"},
+            {"a translucent twin is not touched", "aA", "", "A"},
+            {"a removed one between two equal others", "abBa", "aa", "aBa"},
+            {"stored list empty", "", "ab", "ab"},
+            {"both empty", "", "", ""},
+        });
     }
     void editsWithoutAlphaAreMerged()
     {
-        QFETCH(QString, stored);
-        QFETCH(QString, edited);
-        QFETCH(QString, merged);
-        m_defaults->set(key, encoded(colors(stored.toLatin1().constData())));
+        const auto [stored, edited, merged] = row<QByteArray, QByteArray, QByteArray>();
+        m_defaults->set(key, encoded(colors(stored.constData())));
         FavoritesStore store(*m_defaults);
-        store.saveFavoriteColors(colors(edited.toLatin1().constData()), false);
-        QCOMPARE(letters(store.favoriteColors(true)), merged);
+        store.saveFavoriteColors(colors(edited.constData()), false);
+        QCOMPARE(letters(store.favoriteColors(true)), QString::fromLatin1(merged));
 
-        store.saveFavoriteColors(colors(edited.toLatin1().constData()), true);
-        QCOMPARE(letters(store.favoriteColors(true)), edited);
+        store.saveFavoriteColors(colors(edited.constData()), true);
+        QCOMPARE(letters(store.favoriteColors(true)), QString::fromLatin1(edited));
     }
 
     void randomEditsWithoutAlphaKeepWhatTheyDidNotSee()

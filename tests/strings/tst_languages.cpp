@@ -3,6 +3,8 @@
 #include "platform/strings/localizedstring.h"
 #include "platform/strings/translationtable.h"
 
+#include "../shared/table.h"
+
 #include <QDir>
 #include <QSet>
 #include <QTest>
@@ -62,48 +64,46 @@ private Q_SLOTS:
 
     void findsTheLanguage_data()
     {
-        QTest::addColumn<QString>("language");
-        const auto row = [](const char *locale, const char *language) {
-            QTest::newRow(locale) << QString::fromLatin1(language);
-        };
-        row("de", "de");
-        row("de-AT", "de");
-        row("gsw", "de");
-        row("pt", "pt-BR");
-        row("pt-BR", "pt-BR");
-        row("pt-AO", "pt-PT");
-        row("pt-PT", "pt-PT");
-        row("zh", "zh-Hans");
-        row("zh-CN", "zh-Hans");
-        row("zh-SG", "zh-Hans");
-        row("zh-TW", "zh-Hant");
-        row("zh-HK", "zh-Hant");
-        row("zh-Hant-MO", "zh-Hant");
-        row("no", "nb");
-        row("nn", "nb");
-        row("nn-NO", "nb");
-        row("sr", "sr");
-        row("sr-RS", "sr");
-        row("sr-ME", "sr-Latn");
-        row("sr-Latn-RS", "sr-Latn");
-        row("iw", "he");
-        row("in-ID", "id");
-        row("en-GB", "en");
-        row("es-419", "es");
-        row("fr-CA", "fr");
-        row("ar-EG", "ar");
-        row("en-XA", "en-XA");
-        row("ar-XB", "ar-XB");
-        // Not translated: the texts, not their keys.
-        row("sw", "en");
-        row("C", "en");
-        row("", "en");
-        row("../en", "en");
-        row("x", "en");
+        addRows<QString>({
+            {"de", u"de"_s},
+            {"de-AT", u"de"_s},
+            {"gsw", u"de"_s},
+            {"pt", u"pt-BR"_s},
+            {"pt-BR", u"pt-BR"_s},
+            {"pt-AO", u"pt-PT"_s},
+            {"pt-PT", u"pt-PT"_s},
+            {"zh", u"zh-Hans"_s},
+            {"zh-CN", u"zh-Hans"_s},
+            {"zh-SG", u"zh-Hans"_s},
+            {"zh-TW", u"zh-Hant"_s},
+            {"zh-HK", u"zh-Hant"_s},
+            {"zh-Hant-MO", u"zh-Hant"_s},
+            {"no", u"nb"_s},
+            {"nn", u"nb"_s},
+            {"nn-NO", u"nb"_s},
+            {"sr", u"sr"_s},
+            {"sr-RS", u"sr"_s},
+            {"sr-ME", u"sr-Latn"_s},
+            {"sr-Latn-RS", u"sr-Latn"_s},
+            {"iw", u"he"_s},
+            {"in-ID", u"id"_s},
+            {"en-GB", u"en"_s},
+            {"es-419", u"es"_s},
+            {"fr-CA", u"fr"_s},
+            {"ar-EG", u"ar"_s},
+            {"en-XA", u"en-XA"_s},
+            {"ar-XB", u"ar-XB"_s},
+            // Not translated: the texts, not their keys.
+            {"sw", u"en"_s},
+            {"C", u"en"_s},
+            {"", u"en"_s},
+            {"../en", u"en"_s},
+            {"x", u"en"_s},
+        });
     }
     void findsTheLanguage()
     {
-        QFETCH(QString, language);
+        const auto [language] = row<QString>();
         QCOMPARE(installTranslations(QString::fromLatin1(QTest::currentDataTag())), language);
         QVERIFY(text("Eyedropper_Accessibility") != u"Eyedropper_Accessibility"_s);
     }
@@ -129,36 +129,31 @@ private Q_SLOTS:
 
     void namesOfColorsAgree_data()
     {
-        QTest::addColumn<QString>("language");
-        QTest::addColumn<QString>("darkRed");
-        QTest::addColumn<QString>("lightPink");
-        QTest::addColumn<QString>("mediumBluishGray");
-        const auto row = [](const char *language, const char16_t *red, const char16_t *pink, const char16_t *gray) {
-            QTest::newRow(language) << QString::fromLatin1(language) << QString::fromUtf16(red)
-                                    << QString::fromUtf16(pink) << QString::fromUtf16(gray);
-        };
-        row("en", u"dark red", u"light pink", u"medium bluish gray");
-        row("de", u"dunkles Rot", u"helles Rosa", u"mittleres Blaugrau");
-        row("sv", u"mörkröd", u"ljusrosa", u"mellanblågrå");
-        row("fr", u"rouge foncé", u"rose clair", u"gris bleuté moyen");
-        row("es", u"rojo oscuro", u"rosa claro", u"gris azulado medio");
-        row("fi", u"tummanpunainen", u"vaaleanpinkki", u"keskisiniharmaa");
-        row("et", u"tumepunane", u"heleroosa", u"keskmine sinakashall");
-        row("ru", u"тёмный красный", u"светлый розовый", u"средний синевато-серый");
-        row("sk", u"tmavá červená", u"svetlá ružová", u"stredná modrosivá");
-        row("lt", u"tamsiai raudona", u"šviesiai rožinė", u"vidutiniškai melsvai pilka");
-        row("ar", u"أحمر داكن", u"وردي فاتح", u"رمادي مزرق متوسط");
-        row("he", u"אדום כהה", u"ורוד בהיר", u"אפור כחלחל בינוני");
-        row("th", u"สีแดงเข้ม", u"สีชมพูอ่อน", u"สีเทาอมน้ำเงินปานกลาง");
-        row("zh-Hant", u"深紅色", u"淺粉紅色", u"中藍灰色");
+        addRows<QString, QString, QString>({
+            {"en", u"dark red"_s, u"light pink"_s, u"medium bluish gray"_s},
+            {"de", u"dunkles Rot"_s, u"helles Rosa"_s, u"mittleres Blaugrau"_s},
+            {"sv", u"mörkröd"_s, u"ljusrosa"_s, u"mellanblågrå"_s},
+            {"fr", u"rouge foncé"_s, u"rose clair"_s, u"gris bleuté moyen"_s},
+            {"es", u"rojo oscuro"_s, u"rosa claro"_s, u"gris azulado medio"_s},
+            {"fi", u"tummanpunainen"_s, u"vaaleanpinkki"_s, u"keskisiniharmaa"_s},
+            {"et", u"tumepunane"_s, u"heleroosa"_s, u"keskmine sinakashall"_s},
+            {"ru", u"тёмный красный"_s, u"светлый розовый"_s, u"средний синевато-серый"_s},
+            {"sk", u"tmavá červená"_s, u"svetlá ružová"_s, u"stredná modrosivá"_s},
+            {"lt", u"tamsiai raudona"_s, u"šviesiai rožinė"_s, u"vidutiniškai melsvai pilka"_s},
+            {"ar", u"أحمر داكن"_s, u"وردي فاتح"_s, u"رمادي مزرق متوسط"_s},
+            {"he", u"אדום כהה"_s, u"ורוד בהיר"_s, u"אפור כחלחל בינוני"_s},
+            {"th", u"สีแดงเข้ม"_s, u"สีชมพูอ่อน"_s, u"สีเทาอมน้ำเงินปานกลาง"_s},
+            {"zh-Hant", u"深紅色"_s, u"淺粉紅色"_s, u"中藍灰色"_s},
+        });
     }
     void namesOfColorsAgree()
     {
-        QFETCH(QString, language);
+        const auto [darkRed, lightPink, mediumBluishGray] = row<QString, QString, QString>();
+        const QString language = QString::fromLatin1(QTest::currentDataTag());
         QCOMPARE(installTranslations(language), language);
-        QTEST(nameOf(0x840000), "darkRed");
-        QTEST(nameOf(0xFFD1DF), "lightPink");
-        QTEST(nameOf(0x66707A), "mediumBluishGray");
+        QCOMPARE(nameOf(0x840000), darkRed);
+        QCOMPARE(nameOf(0xFFD1DF), lightPink);
+        QCOMPARE(nameOf(0x66707A), mediumBluishGray);
     }
 
     void pseudoLocales()
