@@ -24,6 +24,7 @@ public:
         FVColor color;
         QString space;
         bool isVolatile;
+        bool operator==(const Pick &) const = default;
     };
 
     explicit RoadHost(QSize size = QSize(900, 700))
@@ -37,6 +38,25 @@ public:
     }
 
     bool isReady() const { return picker.state() == FVColorPickerViewController::State::Ready; }
+    bool hasFinalPick() const { return !picks.empty() && !picks.back().isVolatile; }
+    /** Over the whole window; false when the picker does not come. */
+    bool present()
+    {
+        picker.present(&window);
+        return QTest::qWaitFor([this] { return isReady(); });
+    }
+    bool present(const FVColor &color)
+    {
+        picker.setSelectedColor(color);
+        return present();
+    }
+    bool embed(QQuickItem &container)
+    {
+        picker.embed(&container);
+        return QTest::qWaitFor([this] { return isReady(); });
+    }
+    void click(QPoint place) { QTest::mouseClick(&window, Qt::LeftButton, {}, place); }
+    QRgb pixel(QPoint place) { return window.grabWindow().pixel(place); }
 
     /** A place in the tab's area, in fractions of its width and height, as a point of the window. */
     QPoint inTab(double x, double y) const { return inWindow(tabArea(), {x, y}); }
@@ -94,6 +114,8 @@ public:
 
     QQuickWindow window;
     FVColorPickerViewController picker;
+    QSignalSpy finished{&picker, &FVColorPickerViewController::colorPickerDidFinish};
+    QSignalSpy terminated{&picker, &FVColorPickerViewController::colorPickerViewServiceDidTerminateWithError};
     std::vector<Pick> picks;
 };
 

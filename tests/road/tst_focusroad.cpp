@@ -1,18 +1,16 @@
 #include "roadtest.h"
 
-using State = FVColorPickerViewController::State;
-
 namespace {
 
 /** Two elements of the app, and between them a container for the picker. */
 class HostWithElements : public RoadHost
 {
 public:
-    explicit HostWithElements(QSize container = QSize(380, 640)) : RoadHost(QSize(900, 700))
+    HostWithElements()
     {
         before.setActiveFocusOnTab(true);
         place.setPosition(QPointF(30, 20));
-        place.setSize(container);
+        place.setSize(QSizeF(380, 640));
         after.setActiveFocusOnTab(true);
         window.requestActivate();
     }
@@ -43,104 +41,93 @@ class FocusRoadTest : public RoadTest
     Q_OBJECT
 
 private Q_SLOTS:
-    void goesThroughAnEmbeddedPicker_data();
-    void goesThroughAnEmbeddedPicker();
-    void entersWhereItComesFrom();
-    void goesRoundWhereThereIsNothingElse();
-    void staysInAPresentedPicker();
-    void takesWhatIsTypedBeforeItHasItsKeyboard();
+    void goesThroughAnEmbeddedPicker_data()
+    {
+        QTest::addColumn<bool>("forward");
+        QTest::newRow("forward") << true;
+        QTest::newRow("backward") << false;
+    }
+
+    void goesThroughAnEmbeddedPicker()
+    {
+        QFETCH(bool, forward);
+        HostWithElements host;
+        QVERIFY(host.embed(host.place));
+        QQuickItem &start = forward ? host.before : host.after;
+        QQuickItem &end = forward ? host.after : host.before;
+        start.forceActiveFocus(Qt::TabFocusReason);
+        const Qt::Key key = forward ? Qt::Key_Tab : Qt::Key_Backtab;
+        host.tab(1, key);
+        QVERIFY(host.picker.view()->hasActiveFocus());
+        host.tab(stops - 1, key);
+        // The last element has it still; one more leaves.
+        QVERIFY(host.picker.view()->hasActiveFocus());
+        host.tab(1, key);
+        QTRY_VERIFY(end.hasActiveFocus());
+        QVERIFY(host.picks.empty());
+    }
+
+    void entersWhereItComesFrom()
+    {
+        HostWithElements host;
+        QVERIFY(host.embed(host.place));
+        host.before.forceActiveFocus(Qt::TabFocusReason);
+        host.tab(3);
+        QTest::keyClick(&host.window, Qt::Key_Down);
+        // The third element is the grid, whose keys pick; black, which is selected, is in its topmost row.
+        QTRY_VERIFY(!host.picks.empty());
+        const auto picks = host.picks.size();
+        host.tab(5);
+        QTRY_VERIFY(host.after.hasActiveFocus());
+        host.tab(5, Qt::Key_Backtab);
+        QTest::keyClick(&host.window, Qt::Key_Down);
+        QTRY_VERIFY(host.picks.size() > picks);
+    }
+
+    void goesRoundWhereThereIsNothingElse()
+    {
+        HostWithElements host;
+        host.before.setActiveFocusOnTab(false);
+        host.after.setActiveFocusOnTab(false);
+        QVERIFY(host.embed(host.place));
+        // It has the focus from the start. The last element leads to the first, and that further on to the grid.
+        QVERIFY(host.picker.view()->hasActiveFocus());
+        host.tab(stops + 3);
+        QTest::keyClick(&host.window, Qt::Key_Down);
+        QTRY_VERIFY(!host.picks.empty());
+        QVERIFY(host.picker.view()->hasActiveFocus());
+    }
+
+    void staysInAPresentedPicker()
+    {
+        HostWithElements host;
+        host.before.forceActiveFocus();
+        QVERIFY(host.present());
+        // With the close button there is one more.
+        host.tab(stops + 1 + 4);
+        QTest::keyClick(&host.window, Qt::Key_Down);
+        QTRY_VERIFY(!host.picks.empty());
+        QVERIFY(host.picker.view()->hasActiveFocus());
+        host.picker.dismiss();
+        QTRY_COMPARE(host.finished.size(), 1);
+        QVERIFY(host.before.hasActiveFocus());
+    }
+
+    void takesWhatIsTypedBeforeItHasItsKeyboard()
+    {
+        HostWithElements host;
+        connect(&host.picker, &FVColorPickerViewController::stateChanged, &host.window, [&host] {
+            if (!host.isReady())
+                return;
+            for (const Qt::Key key : {Qt::Key_Tab, Qt::Key_Tab, Qt::Key_Tab, Qt::Key_Tab, Qt::Key_Down})
+                QTest::keyClick(&host.window, key);
+        });
+        host.picker.present(&host.window);
+        // Close button, eyedropper, tab picker, and the grid, whose keys pick.
+        QTRY_VERIFY(!host.picks.empty());
+        QVERIFY(!host.picks.back().isVolatile);
+    }
 };
-
-void FocusRoadTest::goesThroughAnEmbeddedPicker_data()
-{
-    QTest::addColumn<bool>("forward");
-    QTest::newRow("forward") << true;
-    QTest::newRow("backward") << false;
-}
-
-void FocusRoadTest::goesThroughAnEmbeddedPicker()
-{
-    QFETCH(bool, forward);
-    HostWithElements host;
-    host.picker.embed(&host.place);
-    QTRY_VERIFY(host.isReady());
-    QQuickItem &start = forward ? host.before : host.after;
-    QQuickItem &end = forward ? host.after : host.before;
-    start.forceActiveFocus(Qt::TabFocusReason);
-    const Qt::Key key = forward ? Qt::Key_Tab : Qt::Key_Backtab;
-    host.tab(1, key);
-    QVERIFY(host.picker.view()->hasActiveFocus());
-    host.tab(stops - 1, key);
-    // The last element has it still; one more leaves.
-    QVERIFY(host.picker.view()->hasActiveFocus());
-    host.tab(1, key);
-    QTRY_VERIFY(end.hasActiveFocus());
-    QVERIFY(host.picks.empty());
-}
-
-void FocusRoadTest::entersWhereItComesFrom()
-{
-    HostWithElements host;
-    host.picker.embed(&host.place);
-    QTRY_VERIFY(host.isReady());
-    host.before.forceActiveFocus(Qt::TabFocusReason);
-    host.tab(3);
-    QTest::keyClick(&host.window, Qt::Key_Down);
-    // The third element is the grid, whose keys pick; black, which is selected, is in its topmost row.
-    QTRY_VERIFY(!host.picks.empty());
-    const auto picks = host.picks.size();
-    host.tab(5);
-    QTRY_VERIFY(host.after.hasActiveFocus());
-    host.tab(5, Qt::Key_Backtab);
-    QTest::keyClick(&host.window, Qt::Key_Down);
-    QTRY_VERIFY(host.picks.size() > picks);
-}
-
-void FocusRoadTest::goesRoundWhereThereIsNothingElse()
-{
-    HostWithElements host;
-    host.before.setActiveFocusOnTab(false);
-    host.after.setActiveFocusOnTab(false);
-    host.picker.embed(&host.place);
-    QTRY_VERIFY(host.isReady());
-    // It has the focus from the start. The last element leads to the first, and that further on to the grid.
-    QVERIFY(host.picker.view()->hasActiveFocus());
-    host.tab(stops + 3);
-    QTest::keyClick(&host.window, Qt::Key_Down);
-    QTRY_VERIFY(!host.picks.empty());
-    QVERIFY(host.picker.view()->hasActiveFocus());
-}
-
-void FocusRoadTest::staysInAPresentedPicker()
-{
-    HostWithElements host;
-    host.before.forceActiveFocus();
-    host.picker.present(&host.window);
-    QTRY_VERIFY(host.isReady());
-    // With the close button there is one more.
-    host.tab(stops + 1 + 4);
-    QTest::keyClick(&host.window, Qt::Key_Down);
-    QTRY_VERIFY(!host.picks.empty());
-    QVERIFY(host.picker.view()->hasActiveFocus());
-    host.picker.dismiss();
-    QTRY_COMPARE(host.picker.state(), State::NotRunning);
-    QVERIFY(host.before.hasActiveFocus());
-}
-
-void FocusRoadTest::takesWhatIsTypedBeforeItHasItsKeyboard()
-{
-    HostWithElements host;
-    connect(&host.picker, &FVColorPickerViewController::stateChanged, &host.window, [&host] {
-        if (!host.isReady())
-            return;
-        for (const Qt::Key key : {Qt::Key_Tab, Qt::Key_Tab, Qt::Key_Tab, Qt::Key_Tab, Qt::Key_Down})
-            QTest::keyClick(&host.window, key);
-    });
-    host.picker.present(&host.window);
-    // Close button, eyedropper, tab picker, and the grid, whose keys pick.
-    QTRY_VERIFY(!host.picks.empty());
-    QVERIFY(!host.picks.back().isVolatile);
-}
 
 QTEST_MAIN(FocusRoadTest)
 #include "tst_focusroad.moc"

@@ -1,19 +1,18 @@
 #include "onepointer.h"
 #include "roadtest.h"
 
+#include <QClipboard>
+#include <QGuiApplication>
+
 namespace {
 
 constexpr int spectrumTab = 1;
 constexpr int slidersTab = 2;
 
-bool isAbout(double value, double wanted)
-{
-    return std::abs(value - wanted) < 1e-6;
-}
-
 bool isAbout(const FVColor &color, double red, double green, double blue)
 {
-    return isAbout(color.red(), red) && isAbout(color.green(), green) && isAbout(color.blue(), blue);
+    const auto isNear = [](double value, double wanted) { return std::abs(value - wanted) < 1e-6; };
+    return isNear(color.red(), red) && isNear(color.green(), green) && isNear(color.blue(), blue);
 }
 
 /** Whether the pixels show the color, with a rounding to spare. */
@@ -32,120 +31,145 @@ class TabsRoadTest : public RoadTest
     Q_OBJECT
 
 private Q_SLOTS:
-    void aDragAcrossTheSpectrumKeepsOpacityAndSpace_data();
-    void aDragAcrossTheSpectrumKeepsOpacityAndSpace();
-    void theLensAndTheFieldShowWhatIsPicked_data();
-    void theLensAndTheFieldShowWhatIsPicked();
-    void theTabThatWasLeftIsShownAgain();
-};
-
-void TabsRoadTest::aDragAcrossTheSpectrumKeepsOpacityAndSpace_data()
-{
-    QTest::addColumn<QString>("space");
-    QTest::addColumn<bool>("byTouch");
-    QTest::newRow("sRGB, finger") << FVColor::sRGBName() << true;
-    QTest::newRow("Display P3, mouse") << FVColor::displayP3Name() << false;
-}
-
-void TabsRoadTest::aDragAcrossTheSpectrumKeepsOpacityAndSpace()
-{
-    QFETCH(QString, space);
-    QFETCH(bool, byTouch);
-    RoadHost host;
-    host.picker.setSelectedColor(FVColor(0.25, 0.5, 0.75, 0.4, space));
-    host.picker.present(&host.window);
-    QTRY_VERIFY(host.isReady());
-    QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.tabSegment(spectrumTab));
-
-    Pointer pointer(host.window, byTouch ? touchScreen() : nullptr);
-    pointer.press(host.inTab(0.5, 0.3));
-    QTRY_VERIFY(host.picks.size() >= 2);
-    pointer.move(host.inTab(0, 0.4));
-    QTRY_VERIFY(isAbout(host.picks.back().color, 1, 1, 1));
-    pointer.move(host.inTab(1.3, 0.9));
-    QTRY_VERIFY(isAbout(host.picks.back().color, 0, 0, 0));
-    QVERIFY(host.picks.back().isVolatile);
-    pointer.release(host.inTab(1.3, 0.9));
-    QTRY_VERIFY(!host.picks.back().isVolatile);
-
-    QVERIFY(isAbout(host.picks.back().color, 0, 0, 0));
-    for (std::size_t i = 0; i < host.picks.size(); ++i) {
-        QCOMPARE(host.picks[i].isVolatile, i + 1 < host.picks.size());
-        QCOMPARE(host.picks[i].color.alpha(), 0.4);
-        QCOMPARE(host.picks[i].space, space);
+    void aDragAcrossTheSpectrumKeepsOpacityAndSpace_data()
+    {
+        QTest::addColumn<QString>("space");
+        QTest::addColumn<bool>("byTouch");
+        QTest::newRow("sRGB, finger") << FVColor::sRGBName() << true;
+        QTest::newRow("Display P3, mouse") << FVColor::displayP3Name() << false;
     }
-}
 
-void TabsRoadTest::theLensAndTheFieldShowWhatIsPicked_data()
-{
-    QTest::addColumn<QPointF>("place");
-    QTest::addColumn<QString>("space");
-    QTest::newRow("tint") << QPointF(0.2, 0.15) << FVColor::sRGBName();
-    QTest::newRow("full color") << QPointF(0.5, 0.6) << FVColor::sRGBName();
-    QTest::newRow("shade") << QPointF(0.8, 0.35) << FVColor::displayP3Name();
-}
+    void aDragAcrossTheSpectrumKeepsOpacityAndSpace()
+    {
+        QFETCH(QString, space);
+        QFETCH(bool, byTouch);
+        RoadHost host;
+        QVERIFY(host.present(FVColor(0.25, 0.5, 0.75, 0.4, space)));
+        host.click(host.tabSegment(spectrumTab));
 
-void TabsRoadTest::theLensAndTheFieldShowWhatIsPicked()
-{
-    QFETCH(QPointF, place);
-    QFETCH(QString, space);
-    constexpr int ringRadius = 13;
-    RoadHost host;
-    // Of a width that makes the field a whole number of points high: its pixels are then exactly those of the window.
-    QQuickItem container(host.window.contentItem());
-    container.setSize(QSizeF(392, 690));
-    host.picker.setSelectedColor(FVColor(0.25, 0.5, 0.75, 1, space));
-    host.picker.embed(&container);
-    QTRY_VERIFY(host.isReady());
-    QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.tabSegment(spectrumTab));
+        Pointer pointer(host.window, byTouch ? touchScreen() : nullptr);
+        pointer.press(host.inTab(0.5, 0.3));
+        QTRY_VERIFY(host.picks.size() >= 2);
+        pointer.move(host.inTab(0, 0.4));
+        QTRY_VERIFY(isAbout(host.picks.back().color, 1, 1, 1));
+        pointer.move(host.inTab(1.3, 0.9));
+        QTRY_VERIFY(isAbout(host.picks.back().color, 0, 0, 0));
+        pointer.release(host.inTab(1.3, 0.9));
+        QTRY_VERIFY(host.hasFinalPick());
 
-    // The middle of a pixel, which is what the field's pixel shows.
-    const QPoint pixel = host.inTab(place.x(), place.y());
-    const QPointF middle = QPointF(pixel) + QPointF(0.5, 0.5);
-    const auto send = [&host](QEvent::Type type, QPointF position) {
-        const auto button = type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton;
-        const auto held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
-        QMouseEvent event(type, position, position, button, held, {});
-        QCoreApplication::sendEvent(&host.window, &event);
-    };
-    send(QEvent::MouseButtonPress, middle);
-    QTRY_VERIFY(host.picks.size() >= 2);
-    const QColor picked = host.picks.back().color.toQColor();
-    const auto isRing = [](QRgb color) { return color == 0xffffffff; };
-    QTRY_VERIFY(isRing(host.window.grabWindow().pixel(pixel + QPoint(ringRadius, 0))));
-    const QImage underTheFinger = host.window.grabWindow();
-    QVERIFY(isAbout(underTheFinger.pixel(pixel), picked));
-    for (const QPoint direction : {QPoint(-1, 0), QPoint(0, -1), QPoint(0, 1)})
-        QVERIFY(isRing(underTheFinger.pixel(pixel + ringRadius * direction)));
+        QVERIFY(isAbout(host.picks.back().color, 0, 0, 0));
+        for (std::size_t i = 0; i < host.picks.size(); ++i) {
+            QCOMPARE(host.picks[i].isVolatile, i + 1 < host.picks.size());
+            QCOMPARE(host.picks[i].color.alpha(), 0.4);
+            QCOMPARE(host.picks[i].space, space);
+        }
+    }
 
-    send(QEvent::MouseMove, host.inTab(0.5, 0.9));
-    QTRY_VERIFY(isRing(host.window.grabWindow().pixel(host.inTab(0.5, 0.9) + QPoint(ringRadius, 0))));
-    const QRgb field = host.window.grabWindow().pixel(pixel);
-    QVERIFY2(isAbout(field, picked), qPrintable(QColor(field).name() + QLatin1Char(' ') + picked.name()));
-    send(QEvent::MouseButtonRelease, host.inTab(0.5, 0.9));
-    QTRY_VERIFY(!host.picks.back().isVolatile);
-}
+    void theLensAndTheFieldShowWhatIsPicked_data()
+    {
+        QTest::addColumn<QPointF>("place");
+        QTest::addColumn<QString>("space");
+        QTest::newRow("tint") << QPointF(0.2, 0.15) << FVColor::sRGBName();
+        QTest::newRow("full color") << QPointF(0.5, 0.6) << FVColor::sRGBName();
+        QTest::newRow("shade") << QPointF(0.8, 0.35) << FVColor::displayP3Name();
+    }
 
-void TabsRoadTest::theTabThatWasLeftIsShownAgain()
-{
-    RoadHost host(QSize(420, 900));
-    host.picker.setSelectedColor(FVColor(0.75, 0.5, 0.25));
-    host.picker.present(&host.window);
-    QTRY_VERIFY(host.isReady());
-    QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.tabSegment(slidersTab));
-    // Beside its title the segment is white once its tab is shown.
-    QTRY_COMPARE(host.window.grabWindow().pixel(host.tabSegment(slidersTab) + QPoint(50, 0)), 0xffffffff);
-    QSignalSpy finished(&host.picker, &FVColorPickerViewController::colorPickerDidFinish);
-    host.picker.dismiss();
-    QTRY_COMPARE(finished.size(), 1);
+    void theLensAndTheFieldShowWhatIsPicked()
+    {
+        QFETCH(QPointF, place);
+        QFETCH(QString, space);
+        RoadHost host;
+        // Of a width that makes the field a whole number of points high: its pixels are then those of the window.
+        QQuickItem container(host.window.contentItem());
+        container.setSize(QSizeF(392, 690));
+        host.picker.setSelectedColor(FVColor(0.25, 0.5, 0.75, 1, space));
+        QVERIFY(host.embed(container));
+        host.click(host.tabSegment(spectrumTab));
 
-    host.picker.present(&host.window);
-    QTRY_VERIFY(host.isReady());
-    // The left end of red's track; the grid and the spectrum have no such color.
-    QTest::mouseClick(&host.window, Qt::LeftButton, {}, host.inTab(0.01, 0.13));
-    QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
-    QTRY_VERIFY(isAbout(host.picks.back().color, 0, 0.5, 0.25));
-}
+        const QPoint pixel = host.inTab(place.x(), place.y());
+        const auto send = [&host](QEvent::Type type, QPointF position) {
+            const auto button = type == QEvent::MouseMove ? Qt::NoButton : Qt::LeftButton;
+            const auto held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
+            QMouseEvent event(type, position, position, button, held, {});
+            QCoreApplication::sendEvent(&host.window, &event);
+        };
+        const auto hasRing = [&host](QPoint center) {
+            const QImage picture = host.window.grabWindow();
+            constexpr int radius = 13;
+            const QPoint directions[] = {{1, 0}, {-1, 0}, {0, -1}, {0, 1}};
+            return std::ranges::all_of(
+                directions, [&](QPoint direction) { return picture.pixel(center + radius * direction) == 0xffffffff; });
+        };
+        // The middle of a pixel, which is what the field's pixel shows.
+        send(QEvent::MouseButtonPress, QPointF(pixel) + QPointF(0.5, 0.5));
+        QTRY_VERIFY(host.picks.size() >= 2);
+        const QColor picked = host.picks.back().color.toQColor();
+        QTRY_VERIFY(hasRing(pixel));
+        QVERIFY(isAbout(host.pixel(pixel), picked));
+
+        const QPoint elsewhere = host.inTab(0.5, 0.9);
+        send(QEvent::MouseMove, elsewhere);
+        QTRY_VERIFY(hasRing(elsewhere));
+        const QRgb field = host.pixel(pixel);
+        QVERIFY2(isAbout(field, picked), qPrintable(QColor(field).name() + QLatin1Char(' ') + picked.name()));
+        send(QEvent::MouseButtonRelease, elsewhere);
+        QTRY_VERIFY(host.hasFinalPick());
+    }
+
+    void fieldsTakeEveryKeyAndWhatIsPasted()
+    {
+        const FVColor odd(0.1 + 0.2, 1.0 / 3.0, 5e-324, 0.123456789012345678);
+        RoadHost host(QSize(420, 900));
+        host.window.requestActivate();
+        QVERIFY(host.present(odd));
+        host.click(host.tabSegment(slidersTab));
+        const auto tab = [&host](int times) {
+            for (int time = 0; time < times; ++time)
+                QTest::keyClick(&host.window, Qt::Key_Tab);
+        };
+        auto *clipboard = QGuiApplication::clipboard();
+        const auto copied = [&] {
+            clipboard->clear();
+            QTest::keyClick(&host.window, Qt::Key_A, Qt::ControlModifier);
+            QTest::keyClick(&host.window, Qt::Key_C, Qt::ControlModifier);
+            return QTest::qWaitFor([clipboard] { return !clipboard->text().isEmpty(); }) ? clipboard->text()
+                                                                                         : QString();
+        };
+        // Eyedropper, close button, tab picker, and a track and a field for each component. That of blue takes digits
+        // only, and three of them.
+        tab(9);
+        for (const char key : {'x', '2', '5', '-', '4', '7'})
+            QTest::keyClick(&host.window, key);
+        QCOMPARE(copied(), QStringLiteral("254"));
+        QCOMPARE(host.picks.size(), std::size_t(3));
+        for (std::size_t i = 0; i < 3; ++i) {
+            const FVColor typed(odd.red(), odd.green(), std::array{2, 25, 254}[i] / 255.0, odd.alpha());
+            QCOMPARE(host.picks[i], (RoadHost::Pick{typed, FVColor::sRGBName(), false}));
+        }
+        // The button of the color space, and the field of its hexadecimal digits.
+        tab(2);
+        QCOMPARE(copied(), QStringLiteral("4D55FE"));
+        clipboard->setText(QStringLiteral("rgb(0 97 253)"));
+        QTest::keyClick(&host.window, Qt::Key_V, Qt::ControlModifier);
+        QTRY_COMPARE(host.picks.size(), std::size_t(4));
+        QCOMPARE(host.picks.back().color, FVColor(0, 97 / 255.0, 253 / 255.0));
+    }
+
+    void theTabThatWasLeftIsShownAgain()
+    {
+        RoadHost host(QSize(420, 900));
+        QVERIFY(host.present(FVColor(0.75, 0.5, 0.25)));
+        host.click(host.tabSegment(slidersTab));
+        // Beside its title the segment is white once its tab is shown.
+        QTRY_COMPARE(host.pixel(host.tabSegment(slidersTab) + QPoint(50, 0)), 0xffffffff);
+        host.picker.dismiss();
+        QTRY_COMPARE(host.finished.size(), 1);
+        QVERIFY(host.present());
+        // The left end of red's track; the grid and the spectrum have no such color.
+        host.click(host.inTab(0.01, 0.13));
+        QTRY_VERIFY(host.hasFinalPick() && isAbout(host.picks.back().color, 0, 0.5, 0.25));
+    }
+};
 
 QTEST_MAIN(TabsRoadTest)
 #include "tst_tabsroad.moc"
