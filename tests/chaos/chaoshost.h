@@ -16,15 +16,19 @@ class ChaosHost : public RoadHost
 {
 public:
     ChaosHost()
-        : terminated(&picker, &FVColorPickerViewController::colorPickerViewServiceDidTerminateWithError)
-        , finished(&picker, &FVColorPickerViewController::colorPickerDidFinish)
     {
         picker.setShowsAlpha(false);
         picker.setReduceMotion(true);
     }
 
-    void present() { picker.present(&window); }
-    void click(QPoint place) { QTest::mouseClick(&window, Qt::LeftButton, {}, place); }
+    bool isUnharmed() const { return isReady() && terminated.isEmpty(); }
+    /** A click that is answered, after all that came before it. */
+    bool picksAt(QPoint place)
+    {
+        picks.clear();
+        click(place);
+        return QTest::qWaitFor([this] { return hasFinalPick(); });
+    }
     /** Keeps @p color as the favorite of this number, counted from 0; there is room for eight on the first page. */
     void addFavorite(const FVColor &color, int number)
     {
@@ -33,14 +37,20 @@ public:
     }
     /** A step of a drag over the grid, back and forth. */
     void dragStep(int step) { QTest::mouseMove(&window, swatch(step / 12 % 10, step % 12)); }
-
-    QSignalSpy terminated;
-    QSignalSpy finished;
 };
 
 inline FVColor gray(int number)
 {
     return {number / 255.0, number / 255.0, number / 255.0};
+}
+
+/** Hexadecimal digits of the favorites of a new user, and behind them of grays from 100 on. */
+inline QStringList favoritesWith(int grays)
+{
+    QStringList list = QStringLiteral("000000 0061fd 33c759 ffcc01 ff3a2f").split(u' ');
+    for (int number = 0; number < grays; ++number)
+        list << gray(100 + number).toQColor().name().mid(1);
+    return list;
 }
 
 /** The settings of the processes that a test starts. */
@@ -57,27 +67,20 @@ public:
     }
     void clear() const
     {
-        for (const auto &entry : QDir(folder()).entryInfoList(QDir::AllEntries | QDir::System | QDir::NoDotAndDotDot)) {
-            if (entry.isDir() && !entry.isSymLink())
-                QDir(entry.filePath()).removeRecursively();
-            else
-                QFile::remove(entry.filePath());
+        for (const auto &entry : entries()) {
+            const QString path = folder() + u'/' + entry;
+            if (!QFile::remove(path))
+                QDir(path).removeRecursively();
         }
     }
-    /** As the next picker would find them: hexadecimal texts of red. */
-    static QStringList favorites(const QString &file)
+    /** As the next picker would find them, in hexadecimal digits. */
+    QStringList favorites() const
     {
-        favrin::platform::UserDefaults defaults(file.toStdString());
+        favrin::platform::UserDefaults defaults(file().toStdString());
         QStringList texts;
         for (const auto &color : favrin::service::FavoritesStore(defaults).favoriteColors(true))
             texts << QColor::fromRgbF(float(color.r), float(color.g), float(color.b)).name().mid(1);
         return texts;
-    }
-    QStringList favorites() const { return favorites(file()); }
-    static QStringList defaultFavorites()
-    {
-        return {QStringLiteral("000000"), QStringLiteral("0061fd"), QStringLiteral("33c759"), QStringLiteral("ffcc01"),
-                QStringLiteral("ff3a2f")};
     }
 
 private:
@@ -91,11 +94,9 @@ private:
 inline bool wasShown(const QStringList &favorites)
 {
     const QStringList added = favorites.mid(5);
-    const QStringList grays = {gray(100).toQColor().name().mid(1), gray(101).toQColor().name().mid(1),
-                               gray(102).toQColor().name().mid(1)};
+    const QStringList grays = favoritesWith(3).mid(5);
     const bool known = std::ranges::all_of(added, [&](const QString &color) { return grays.contains(color); });
-    return favorites.mid(0, 5) == Settings::defaultFavorites() && added.size() <= 3 && known &&
-           std::ranges::is_sorted(added);
+    return favorites.mid(0, 5) == favoritesWith(0) && added.size() <= 3 && known && std::ranges::is_sorted(added);
 }
 
 /** Sends a signal at a moment that has nothing to do with what this thread is doing. */

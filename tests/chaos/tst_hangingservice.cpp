@@ -32,8 +32,7 @@ private Q_SLOTS:
         QVERIFY(replaced.picker.isResponding());
         const pid_t replacement = presented(replaced);
         QVERIFY(replacement != ofReplaced);
-        replaced.click(replaced.swatch(0, 11));
-        QTRY_VERIFY(!replaced.picks.empty());
+        QVERIFY(replaced.picksAt(replaced.swatch(0, 11)));
         // Nobody waits for the one that was left behind.
         QTRY_VERIFY(!QFileInfo::exists(QStringLiteral("/proc/%1/exe").arg(ofReplaced)));
 
@@ -43,9 +42,7 @@ private Q_SLOTS:
         QTRY_VERIFY(!QFileInfo::exists(QStringLiteral("/proc/%1/exe").arg(ofGivenUp)));
 
         QVERIFY(slowReports.isEmpty());
-        QVERIFY(slow.isReady());
-        slow.click(slow.swatch(0, 0));
-        QTRY_VERIFY(!slow.picks.empty());
+        QVERIFY(slow.picksAt(slow.swatch(0, 0)));
     }
 
     void oneThatStopsInTheMiddleOfADragGoesOn_data()
@@ -61,9 +58,7 @@ private Q_SLOTS:
         QFETCH(int, standstill);
         ChaosHost host;
         const pid_t process = presented(host);
-        QVERIFY(process > 0);
-        host.click(host.swatch(9, 3));
-        QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+        QVERIFY(host.picksAt(host.swatch(9, 3)));
         const FVColor expected = host.picks.back().color;
         QTest::mousePress(&host.window, Qt::LeftButton, {}, host.swatch(0, 0));
         QTRY_VERIFY(host.picks.back().isVolatile);
@@ -81,27 +76,26 @@ private Q_SLOTS:
         QTRY_VERIFY(host.picks.size() > reported);
         QTest::mouseMove(&host.window, host.swatch(9, 3));
         QTest::mouseRelease(&host.window, Qt::LeftButton, {}, host.swatch(9, 3));
-        QTRY_VERIFY(!host.picks.back().isVolatile);
+        QTRY_VERIFY(host.hasFinalPick());
         QCOMPARE(host.picks.back().color, expected);
-        QVERIFY(host.isReady() && host.terminated.isEmpty());
+        QVERIFY(host.isUnharmed());
         QTRY_VERIFY(host.picker.isResponding());
     }
 
     void nobodyIsBlamedForAStandstillOfTheApp()
     {
         ChaosHost host;
-        QVERIFY(presented(host) > 0);
+        QVERIFY(host.present());
         QSignalSpy reports(&host.picker, &FVColorPickerViewController::respondingChanged);
         QTest::mousePress(&host.window, Qt::LeftButton, {}, host.swatch(0, 0));
         host.dragStep(1);
         // Longer than the watch waits for an answer.
         QProcess stopper;
-        stopper.start(QStringLiteral("sh"), {QStringLiteral("-c"), QStringLiteral("kill -STOP $PPID; sleep 5; "
-                                                                                  "kill -CONT $PPID")});
+        stopper.startCommand(QStringLiteral("sh -c \"kill -STOP $PPID; sleep 5; kill -CONT $PPID\""));
         QVERIFY(stopper.waitForFinished(patience));
         host.dragStep(2);
         QTest::mouseRelease(&host.window, Qt::LeftButton, {}, host.swatch(9, 3));
-        QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+        QTRY_VERIFY(host.hasFinalPick());
         QVERIFY(reports.isEmpty() && host.terminated.isEmpty());
     }
 
@@ -115,12 +109,12 @@ private Q_SLOTS:
         QVERIFY(program.setPermissions(QFile::ReadUser | QFile::ExeUser));
         qputenv("FAVRIN_COLOR_PICKER_SERVICE", QFile::encodeName(program.fileName()));
         ChaosHost host;
-        host.present();
+        host.picker.present(&host.window);
         QTRY_VERIFY_WITH_TIMEOUT(!host.picker.isResponding(), patience);
         host.picker.dismiss();
         QTRY_COMPARE(host.finished.size(), 1);
         qunsetenv("FAVRIN_COLOR_PICKER_SERVICE");
-        presented(host);
+        QVERIFY(presented(host) > 0);
     }
 
 private:
@@ -129,14 +123,13 @@ private:
     pid_t presented(ChaosHost &host)
     {
         const auto before = servicesOf(getpid());
-        host.present();
+        host.picker.present(&host.window);
         if (!QTest::qWaitFor([&] { return host.isReady(); }, patience))
             return 0;
-        for (const pid_t service : servicesOf(getpid())) {
-            if (std::ranges::find(before, service) == before.end())
-                return service;
-        }
-        return 0;
+        const auto now = servicesOf(getpid());
+        const auto added =
+            std::ranges::find_if(now, [&](pid_t service) { return !std::ranges::count(before, service); });
+        return added == now.end() ? 0 : *added;
     }
 
     Settings m_settings;

@@ -57,7 +57,7 @@ int runAsHost(int argc, char *argv[])
 {
     QGuiApplication application(argc, argv);
     ChaosHost host;
-    host.present();
+    host.picker.present(&host.window);
     QTimer work;
     int step = 0;
     QObject::connect(&work, &QTimer::timeout, &host.window, [&] {

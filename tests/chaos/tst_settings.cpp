@@ -2,6 +2,9 @@
 
 #include "../eyedropper/privatebus.h"
 
+#include <functional>
+#include <map>
+
 #include <fcntl.h>
 #include <sys/mount.h>
 #include <sys/stat.h>
@@ -72,22 +75,20 @@ private Q_SLOTS:
 
     void whatIsNoStoreIsSetAside_data()
     {
-        QTest::addColumn<QString>("what");
         QTest::addColumn<bool>("isSetAside");
         for (const char *what : {"garbage", "large", "folder", "pipe", "link to nothing", "link in a circle"})
-            QTest::newRow(what) << QString::fromLatin1(what) << true;
-        QTest::newRow("empty") << QStringLiteral("empty") << false;
-        QTest::newRow("link to a store") << QStringLiteral("link to a store") << false;
+            QTest::newRow(what) << true;
+        for (const char *what : {"empty", "link to a store"})
+            QTest::newRow(what) << false;
     }
 
     void whatIsNoStoreIsSetAside()
     {
-        QFETCH(QString, what);
         QFETCH(bool, isSetAside);
+        const auto what = QString::fromLatin1(QTest::currentDataTag());
         place(what);
         ChaosHost host;
         addOne(host);
-        QTRY_COMPARE(m_settings.favorites(), withAdded(1));
         const auto aside = m_settings.entries().filter(QStringLiteral("damaged"));
         QCOMPARE(aside.size(), isSetAside ? 1 : 0);
         if (what == u"garbage") {
@@ -109,13 +110,12 @@ private Q_SLOTS:
         QFETCH(QString, by);
         ChaosHost host;
         addOne(host);
-        QTRY_COMPARE(m_settings.favorites(), withAdded(1));
         m_settings.clear();
         place(by);
         // The picker still knows what it shows, and the next change stores that.
         host.addFavorite(gray(101), 6);
         QTRY_COMPARE(m_settings.favorites().last(), gray(101).toQColor().name().mid(1));
-        QVERIFY(host.isReady() && host.terminated.isEmpty());
+        QVERIFY(host.isUnharmed());
     }
 
     void aFullDiskLosesNothing_data()
@@ -134,18 +134,16 @@ private Q_SLOTS:
         {
             ChaosHost host;
             addOne(host);
-            QTRY_COMPARE(m_settings.favorites(), withAdded(1));
             disk.fill(freePages);
             host.addFavorite(gray(101), 6);
-            host.click(host.swatch(2, 2));
-            QTRY_VERIFY(!host.picks.empty());
+            QVERIFY(host.picksAt(host.swatch(2, 2)));
             // The old list or the new one; both are whole.
             const auto stored = m_settings.favorites();
-            QVERIFY2(stored == withAdded(1) || stored == withAdded(2), qPrintable(stored.join(u' ')));
-            QVERIFY(host.isReady() && host.terminated.isEmpty());
+            QVERIFY2(stored == favoritesWith(1) || stored == favoritesWith(2), qPrintable(stored.join(u' ')));
             disk.makeRoom();
             host.addFavorite(gray(102), 7);
-            QTRY_COMPARE(m_settings.favorites(), withAdded(3));
+            QTRY_COMPARE(m_settings.favorites(), favoritesWith(3));
+            QVERIFY(host.isUnharmed());
         }
         QTRY_VERIFY(servicesOf(getpid()).empty());
     }
@@ -158,58 +156,40 @@ private Q_SLOTS:
         {
             ChaosHost host;
             addOne(host);
-            QTRY_COMPARE(m_settings.favorites(), withAdded(1));
-            host.picker.dismiss();
-            QTRY_COMPARE(host.finished.size(), 1);
+            dismiss(host);
             QTRY_VERIFY(servicesOf(getpid()).empty());
             // Busy until the kernel is done with the files of the process that has just gone.
             QTRY_VERIFY(disk.setReadOnly(true));
-            host.present();
-            QTRY_VERIFY(host.isReady());
+            QVERIFY(host.present());
             host.addFavorite(gray(101), 6);
-            host.picks.clear();
             // What cannot be stored is there all the same, as long as the picker is.
-            const QPoint added = host.favorite(1, 2);
-            QTRY_COMPARE(QColor(host.window.grabWindow().pixel(added)), gray(101).toQColor());
+            QTRY_COMPARE(QColor(host.pixel(host.favorite(1, 2))), gray(101).toQColor());
             QVERIFY(disk.setReadOnly(false));
             host.addFavorite(gray(102), 7);
-            QTRY_COMPARE(m_settings.favorites(), withAdded(3));
-            QVERIFY(host.terminated.isEmpty());
+            QTRY_COMPARE(m_settings.favorites(), favoritesWith(3));
+            QVERIFY(host.isUnharmed());
         }
         QTRY_VERIFY(servicesOf(getpid()).empty());
     }
 
-    void severalPickersSaveAtOnce_data()
-    {
-        QTest::addColumn<int>("pickers");
-        QTest::newRow("two") << 2;
-        QTest::newRow("eight") << 8;
-    }
-
     void severalPickersSaveAtOnce()
     {
-        QFETCH(int, pickers);
-        std::vector<std::unique_ptr<ChaosHost>> hosts;
-        for (int number = 0; number < pickers; ++number) {
-            hosts.push_back(std::make_unique<ChaosHost>());
-            hosts.back()->present();
-        }
+        constexpr int pickers = 8;
+        std::array<ChaosHost, pickers> hosts;
+        for (auto &host : hosts)
+            host.picker.present(&host.window);
         for (const auto &host : hosts)
-            QTRY_VERIFY_WITH_TIMEOUT(host->isReady(), 30'000);
+            QTRY_VERIFY_WITH_TIMEOUT(host.isReady(), 30'000);
         for (int number = 0; number < pickers; ++number)
-            hosts[std::size_t(number)]->addFavorite(gray(100 + number), 5);
+            hosts[std::size_t(number)].addFavorite(gray(100 + number), 5);
         // Each has saved when it answers to what came after.
-        for (const auto &host : hosts) {
-            host->click(host->swatch(1, 1));
-            QTRY_VERIFY(!host->picks.empty() && !host->picks.back().isVolatile);
-        }
+        for (auto &host : hosts)
+            QVERIFY(host.picksAt(host.swatch(1, 1)) && host.isUnharmed());
         const auto stored = m_settings.favorites();
-        QCOMPARE(stored.mid(0, 5), Settings::defaultFavorites());
+        QCOMPARE(stored.mid(0, 5), favoritesWith(0));
         auto added = stored.mid(5);
         QVERIFY2(!added.isEmpty() && added.size() <= pickers, qPrintable(stored.join(u' ')));
         QCOMPARE(added.removeDuplicates(), 0);
-        for (const auto &host : hosts)
-            QVERIFY(host->terminated.isEmpty());
     }
 
     void faultsInAnyOrderLoseNothing()
@@ -242,13 +222,8 @@ private Q_SLOTS:
             // Whatever it was: the next favorite is kept, and all before it.
             host.addFavorite(gray(100 + added), 5 + added);
             ++added;
-            QTRY_VERIFY2(m_settings.favorites() == withAdded(added),
-                         qPrintable(QStringLiteral("round %1 of seed %2, %3 and %4: %5")
-                                        .arg(round)
-                                        .arg(seed)
-                                        .arg(int(whom))
-                                        .arg(int(what))
-                                        .arg(m_settings.favorites().join(u' '))));
+            const QList<int> course = {int(seed), round, int(whom), int(what)};
+            QTRY_VERIFY2(m_settings.favorites() == favoritesWith(added), QTest::toString(course));
         }
         host.picker.dismiss();
     }
@@ -272,7 +247,7 @@ private:
         else if (host.isReady() && fault != ToThePicker::Nothing)
             sendSignal(host, fault, when);
         if (!host.picker.isPresented())
-            host.present();
+            host.picker.present(&host.window);
         QTRY_VERIFY(host.isReady());
     }
 
@@ -298,67 +273,46 @@ private:
 
     void happen(ChaosHost &host, ToTheFile fault, const SmallDisk &disk, int &added)
     {
-        switch (fault) {
-        case ToTheFile::Nothing:
+        if (fault == ToTheFile::Nothing || (fault == ToTheFile::FullDisk && !disk.isMounted()))
             return;
-        case ToTheFile::Garbage:
-        case ToTheFile::Folder:
-        case ToTheFile::Loss:
-            m_settings.clear();
-            if (fault != ToTheFile::Loss)
-                place(fault == ToTheFile::Folder ? QStringLiteral("folder") : QStringLiteral("garbage"));
-            return;
-        case ToTheFile::FullDisk:
-            if (!disk.isMounted())
-                return;
+        if (fault == ToTheFile::FullDisk) {
             disk.fill(0);
             host.addFavorite(gray(100 + added), 5 + added);
             ++added;
             // Taken in when it answers to what came after.
-            host.picks.clear();
-            host.click(host.swatch(1, 1));
-            QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+            QVERIFY(host.picksAt(host.swatch(1, 1)));
             disk.makeRoom();
+            return;
         }
+        m_settings.clear();
+        if (fault != ToTheFile::Loss)
+            place(fault == ToTheFile::Folder ? QStringLiteral("folder") : QStringLiteral("garbage"));
     }
 
     /** Shows a picker and keeps a first favorite. */
-    static void addOne(ChaosHost &host)
+    void addOne(ChaosHost &host) const
     {
-        host.present();
-        QTRY_VERIFY(host.isReady());
+        QVERIFY(host.present());
         host.addFavorite(gray(100), 5);
-    }
-
-    static QStringList withAdded(int count)
-    {
-        auto list = Settings::defaultFavorites();
-        for (int number = 0; number < count; ++number)
-            list << gray(100 + number).toQColor().name().mid(1);
-        return list;
+        QTRY_COMPARE(m_settings.favorites(), favoritesWith(1));
     }
 
     void place(const QString &what) const
     {
         const QString file = m_settings.file();
-        const QByteArray path = QFile::encodeName(file);
-        if (what == u"garbage")
-            QVERIFY(writeFile(file, someBytes));
-        else if (what == u"empty")
-            QVERIFY(writeFile(file, {}));
-        else if (what == u"large")
-            QVERIFY(writeFile(file, someBytes, 100'000'000));
-        else if (what == u"folder")
-            QVERIFY(QDir().mkpath(file + QStringLiteral("/folder")));
-        else if (what == u"pipe")
-            QCOMPARE(::mkfifo(path.constData(), 0600), 0);
-        else if (what == u"link to nothing")
-            QVERIFY(QFile::link(QStringLiteral("/nowhere/at/all"), file));
-        else if (what == u"link in a circle")
-            QVERIFY(QFile::link(file, file));
-        else if (what == u"link to a store")
-            QVERIFY(writeFile(m_elsewhere.filePath(QStringLiteral("store")), {}) &&
-                    QFile::link(m_elsewhere.filePath(QStringLiteral("store")), file));
+        const QString store = m_elsewhere.filePath(QStringLiteral("store"));
+        const std::map<QString, std::function<bool()>> ways = {
+            {QStringLiteral("nothing"), [] { return true; }},
+            {QStringLiteral("garbage"), [&] { return writeFile(file, someBytes); }},
+            {QStringLiteral("empty"), [&] { return writeFile(file, {}); }},
+            {QStringLiteral("large"), [&] { return writeFile(file, someBytes, 100'000'000); }},
+            {QStringLiteral("folder"), [&] { return QDir().mkpath(file + QStringLiteral("/folder")); }},
+            {QStringLiteral("pipe"), [&] { return ::mkfifo(QFile::encodeName(file).constData(), 0600) == 0; }},
+            {QStringLiteral("link to nothing"), [&] { return QFile::link(QStringLiteral("/nowhere/at/all"), file); }},
+            {QStringLiteral("link in a circle"), [&] { return QFile::link(file, file); }},
+            {QStringLiteral("link to a store"), [&] { return writeFile(store, {}) && QFile::link(store, file); }},
+        };
+        QVERIFY(ways.at(what)());
     }
 
     Settings m_settings;

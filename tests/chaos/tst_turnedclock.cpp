@@ -47,8 +47,7 @@ private Q_SLOTS:
         m_settings.clear();
         ChaosHost host;
         QSignalSpy reports(&host.picker, &FVColorPickerViewController::respondingChanged);
-        host.present();
-        QTRY_VERIFY(host.isReady());
+        QVERIFY(host.present());
         const auto before = QDateTime::currentSecsSinceEpoch();
 
         for (int number = 0; number < 3; ++number) {
@@ -67,7 +66,7 @@ private Q_SLOTS:
             QCoreApplication::processEvents();
         }
         QTest::mouseRelease(&host.window, Qt::LeftButton, {}, host.swatch(0, 11));
-        QTRY_VERIFY(!host.picks.empty() && !host.picks.back().isVolatile);
+        QTRY_VERIFY(host.hasFinalPick());
         QVERIFY(reports.isEmpty());
 
         // The watch over the process still counts true seconds.
@@ -80,7 +79,7 @@ private Q_SLOTS:
         TurnedClock::turn(turn);
         kill(service, SIGCONT);
         QTRY_VERIFY(host.picker.isResponding());
-        QVERIFY(host.isReady() && host.terminated.isEmpty());
+        QVERIFY(host.isUnharmed());
     }
 
     void whatIsSetAsideAtAnyTimeKeepsItsName()
@@ -98,8 +97,7 @@ private Q_SLOTS:
             file.write("no settings");
             file.close();
             ChaosHost host;
-            host.present();
-            QTRY_VERIFY(host.isReady());
+            QVERIFY(host.present());
             host.addFavorite(gray(100), 5);
             QTRY_COMPARE(m_settings.favorites().size(), 6);
         }
