@@ -52,17 +52,16 @@ public:
                           QUrl());
         const QVariantMap properties = {{QStringLiteral("colorPickerState"), QVariant::fromValue(&state)}};
         view.reset(qobject_cast<QQuickItem *>(component.createWithInitialProperties(properties)));
-        if (!view) {
-            qWarning("%s", qPrintable(component.errorString()));
-            return;
-        }
+        QVERIFY2(view, qPrintable(component.errorString()));
         view->setParentItem(window.contentItem());
         window.resize(344, 400);
         window.show();
         window.requestActivate();
+        QVERIFY(QTest::qWaitForWindowActive(&window));
     }
 
-    bool isReady() { return view && QTest::qWaitForWindowActive(&window); }
+    void click(const QQuickItem *item, double x) { QTest::mouseClick(&window, Qt::LeftButton, {}, at(item, x)); }
+    void click(const QQuickItem *item) { click(item, item->width() / 2.0); }
 
     favrin::sliders::CPSlider *slider(favrin::sliders::ColorComponent::Name component) const
     {
@@ -86,6 +85,8 @@ public:
         });
         return inputs.value(index);
     }
+
+    SomeColor color() const { return state.selectedColor().value(); }
 
     /** A point on the middle of the slider, @p x from its left edge, in the window. */
     static QPoint at(const QQuickItem *item, double x)
