@@ -21,9 +21,8 @@ public:
         window.resize(400, 340);
         window.show();
         window.requestActivate();
+        QVERIFY(QTest::qWaitForWindowActive(&window));
     }
-
-    bool isReady() { return QTest::qWaitForWindowActive(&window); }
 
     /** The middle of a cell in the window. */
     static QPoint middle(int row, int column) { return {20 + 30 * column + 15, 20 + 30 * row + 15}; }
