@@ -54,44 +54,40 @@ class ColorLensTest : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void cleanup();
-    void looksTheSameAfterAnyOther();
-    void discRingAndShadow();
-};
+    void cleanup()
+    {
+        theme::Theme::instance().setColorScheme(service::ColorScheme::Light);
+        service::DisplayColor::instance().setSurfaceColorSpace(Space::sRGB);
+    }
 
-void ColorLensTest::cleanup()
-{
-    theme::Theme::instance().setColorScheme(service::ColorScheme::Light);
-    service::DisplayColor::instance().setSurfaceColorSpace(Space::sRGB);
-}
-
-void ColorLensTest::looksTheSameAfterAnyOther()
-{
-    const auto list = looks();
-    std::vector<QImage> first;
-    for (const Look &look : list)
-        first.push_back(picture(look));
-    for (std::size_t before = 0; before < list.size(); ++before) {
-        for (std::size_t after = 0; after < list.size(); ++after) {
-            picture(list[before]);
-            QCOMPARE(picture(list[after]), first[after]);
-            // Colors beyond sRGB look like the clipped ones there.
-            const bool mayLookAlike = std::min(before, after) == 0 && std::max(before, after) == 7;
-            QVERIFY(before == after || mayLookAlike || first[before] != first[after]);
+    void looksTheSameAfterAnyOther()
+    {
+        const auto list = looks();
+        std::vector<QImage> first;
+        for (const Look &look : list)
+            first.push_back(picture(look));
+        for (std::size_t before = 0; before < list.size(); ++before) {
+            for (std::size_t after = 0; after < list.size(); ++after) {
+                picture(list[before]);
+                QCOMPARE(picture(list[after]), first[after]);
+                // Colors beyond sRGB look like the clipped ones there.
+                const bool mayLookAlike = std::min(before, after) == 0 && std::max(before, after) == 7;
+                QVERIFY(before == after || mayLookAlike || first[before] != first[after]);
+            }
         }
     }
-}
 
-void ColorLensTest::discRingAndShadow()
-{
-    const QImage lens = picture({.color = {0.0, 0.0, 1.0, 0.5, Space::sRGB}});
-    const int center = lens.width() / 2;
-    // Half of blue over the white ring, as everywhere within it.
-    QCOMPARE(lens.pixelColor(center, center), QColor(127, 127, 255));
-    QCOMPARE(lens.pixelColor(center, 4), QColor(Qt::white));
-    const QColor shadow = lens.pixelColor(center, 1);
-    QVERIFY(shadow.alpha() > 0 && shadow.alpha() < 128 && shadow.value() == 0);
-}
+    void discRingAndShadow()
+    {
+        const QImage lens = picture({.color = {0.0, 0.0, 1.0, 0.5, Space::sRGB}});
+        const int center = lens.width() / 2;
+        // Half of blue over the white ring, as everywhere within it.
+        QCOMPARE(lens.pixelColor(center, center), QColor(127, 127, 255));
+        QCOMPARE(lens.pixelColor(center, 4), QColor(Qt::white));
+        const QColor shadow = lens.pixelColor(center, 1);
+        QVERIFY(shadow.alpha() > 0 && shadow.alpha() < 128 && shadow.value() == 0);
+    }
+};
 
 QTEST_MAIN(ColorLensTest)
 #include "tst_colorlens.moc"

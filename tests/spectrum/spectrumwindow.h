@@ -22,9 +22,8 @@ public:
         window.resize(400, 340);
         window.show();
         window.requestActivate();
+        QVERIFY(QTest::qWaitForWindowActive(&window));
     }
-
-    bool isReady() { return QTest::qWaitForWindowActive(&window); }
 
     /** A point of the spectrum in the window. */
     static QPoint at(int x, int y) { return QPoint(x, y) + origin.toPoint(); }

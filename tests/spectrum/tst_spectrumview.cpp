@@ -38,54 +38,51 @@ class SpectrumViewTest : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase();
-    void processorDrawsUntilTheDriverIsReady();
+    void initTestCase()
+    {
+        // Left to itself, a machine without a GPU would look for no driver.
+        qputenv("FAVRIN_GPU", "vulkan");
+    }
+
+    void processorDrawsUntilTheDriverIsReady()
+    {
+        std::string reason;
+        vulkan::VulkanOptions options;
+        options.choice = vulkan::DeviceChoice::AnyDevice;
+        if (!vulkan::VulkanDevice::create(options, &reason))
+            QSKIP(reason.c_str());
+
+        QSignalSpy changes(&SystemDevice::instance(), &SystemDevice::deviceChanged);
+        QQuickWindow window;
+        window.resize(360, 300);
+        SpectrumView view(window.contentItem());
+        view.setSize({328.0, 273.0});
+        window.show();
+        // Nothing has run but this thread, without its event loop: no driver can be in use yet.
+        window.grabWindow();
+        QCOMPARE(changes.count(), 0);
+        QVERIFY(!isVulkan(view.renderer().device()));
+        const QImage byProcessor = view.vexelView().render(1.0);
+        QVERIFY(!byProcessor.isNull());
+
+        QTRY_COMPARE(changes.count(), 1);
+        QVERIFY(isVulkan(view.renderer().device()));
+        QVERIFY(view.renderer().pipelineState());
+        QTRY_VERIFY(view.vexelView().render(1.0).cacheKey() != byProcessor.cacheKey());
+        QVERIFY(largestDistance(view.vexelView().render(1.0), byProcessor) <= 1);
+
+        const auto failed = view.renderer().device();
+        const QImage byVulkan = view.vexelView().render(1.0);
+        SystemDevice::instance().abandon(failed);
+        QCOMPARE(changes.count(), 2);
+        QVERIFY(!isVulkan(view.renderer().device()));
+        QTRY_VERIFY(view.vexelView().render(1.0).cacheKey() != byVulkan.cacheKey());
+        QCOMPARE(view.vexelView().render(1.0), byProcessor);
+        // Given up once, it stays so.
+        SystemDevice::instance().abandon(failed);
+        QCOMPARE(changes.count(), 2);
+    }
 };
-
-void SpectrumViewTest::initTestCase()
-{
-    // Left to itself, a machine without a GPU would look for no driver.
-    qputenv("FAVRIN_GPU", "vulkan");
-}
-
-void SpectrumViewTest::processorDrawsUntilTheDriverIsReady()
-{
-    std::string reason;
-    vulkan::VulkanOptions options;
-    options.choice = vulkan::DeviceChoice::AnyDevice;
-    if (!vulkan::VulkanDevice::create(options, &reason))
-        QSKIP(reason.c_str());
-
-    QSignalSpy changes(&SystemDevice::instance(), &SystemDevice::deviceChanged);
-    QQuickWindow window;
-    window.resize(360, 300);
-    SpectrumView view(window.contentItem());
-    view.setSize({328.0, 273.0});
-    window.show();
-    // Nothing has run but this thread, without its event loop: no driver can be in use yet.
-    window.grabWindow();
-    QCOMPARE(changes.count(), 0);
-    QVERIFY(!isVulkan(view.renderer().device()));
-    const QImage byProcessor = view.vexelView().render(1.0);
-    QVERIFY(!byProcessor.isNull());
-
-    QTRY_COMPARE(changes.count(), 1);
-    QVERIFY(isVulkan(view.renderer().device()));
-    QVERIFY(view.renderer().pipelineState());
-    QTRY_VERIFY(view.vexelView().render(1.0).cacheKey() != byProcessor.cacheKey());
-    QVERIFY(largestDistance(view.vexelView().render(1.0), byProcessor) <= 1);
-
-    const auto failed = view.renderer().device();
-    const QImage byVulkan = view.vexelView().render(1.0);
-    SystemDevice::instance().abandon(failed);
-    QCOMPARE(changes.count(), 2);
-    QVERIFY(!isVulkan(view.renderer().device()));
-    QTRY_VERIFY(view.vexelView().render(1.0).cacheKey() != byVulkan.cacheKey());
-    QCOMPARE(view.vexelView().render(1.0), byProcessor);
-    // Given up once, it stays so.
-    SystemDevice::instance().abandon(failed);
-    QCOMPARE(changes.count(), 2);
-}
 
 QTEST_MAIN(SpectrumViewTest)
 #include "tst_spectrumview.moc"
