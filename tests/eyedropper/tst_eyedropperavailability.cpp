@@ -51,91 +51,84 @@ class TestEyedropperAvailability : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void theServiceIsAsked_data();
-    void theServiceIsAsked();
-    void withoutAServiceThereIsNone();
-    void withoutABusThereIsNone();
-    void aServiceThatCannotBeStartedIsNone();
-    void aServiceMayComeAndGo();
+    void theServiceIsAsked_data()
+    {
+        QTest::addColumn<Answer>("answer");
+        QTest::addColumn<bool>("available");
+        QTest::newRow("it can work") << Answer::Yes << true;
+        QTest::newRow("it cannot work") << Answer::No << false;
+        QTest::newRow("it does not know the question") << Answer::DoesNotKnow << true;
+        QTest::newRow("it is broken") << Answer::Error << false;
+        QTest::newRow("it talks nonsense") << Answer::OtherType << false;
+    }
+
+    void theServiceIsAsked()
+    {
+        QFETCH(Answer, answer);
+        QFETCH(bool, available);
+        PrivateBus bus;
+        QVERIFY(bus.start());
+        const Answerer service(bus.connection(), answer);
+        EyedropperAvailability availability(bus.address());
+        QVERIFY(!availability.isAvailable());
+        QSignalSpy changes(&availability, &EyedropperAvailability::changed);
+        availability.ask();
+        QVERIFY(changes.wait());
+        QVERIFY(availability.isKnown());
+        QCOMPARE(availability.isAvailable(), available);
+    }
+
+    void withoutAServiceThereIsNone()
+    {
+        PrivateBus bus;
+        QVERIFY(bus.start());
+        EyedropperAvailability availability(bus.address());
+        availability.ask();
+        QTRY_VERIFY(availability.isKnown());
+        QVERIFY(!availability.isAvailable());
+    }
+
+    void withoutABusThereIsNone()
+    {
+        PrivateBus bus;
+        QVERIFY(bus.start());
+        bus.stop();
+        EyedropperAvailability availability(bus.address());
+        availability.ask();
+        QTRY_VERIFY(availability.isKnown());
+        QVERIFY(!availability.isAvailable());
+    }
+
+    void aServiceThatCannotBeStartedIsNone()
+    {
+        PrivateBus bus;
+        bus.addService(serviceName, QStringLiteral("/bin/false"));
+        QVERIFY(bus.start());
+        EyedropperAvailability availability(bus.address());
+        availability.ask();
+        QTRY_VERIFY(availability.isKnown());
+        QVERIFY(!availability.isAvailable());
+    }
+
+    void aServiceMayComeAndGo()
+    {
+        PrivateBus bus;
+        QVERIFY(bus.start());
+        EyedropperAvailability availability(bus.address());
+        availability.ask();
+        QTRY_VERIFY(availability.isKnown());
+        QVERIFY(!availability.isAvailable());
+
+        auto service = std::make_unique<Answerer>(bus.connection(), Answer::Yes);
+        QTRY_VERIFY(availability.isAvailable());
+        service.reset();
+        QTRY_VERIFY(!availability.isAvailable());
+        service = std::make_unique<Answerer>(bus.connection(), Answer::DoesNotKnow);
+        QTRY_VERIFY(availability.isAvailable());
+        bus.stop();
+        QTRY_VERIFY(!availability.isAvailable());
+    }
 };
-
-void TestEyedropperAvailability::theServiceIsAsked_data()
-{
-    QTest::addColumn<Answer>("answer");
-    QTest::addColumn<bool>("available");
-    QTest::newRow("it can work") << Answer::Yes << true;
-    QTest::newRow("it cannot work") << Answer::No << false;
-    QTest::newRow("it does not know the question") << Answer::DoesNotKnow << true;
-    QTest::newRow("it is broken") << Answer::Error << false;
-    QTest::newRow("it talks nonsense") << Answer::OtherType << false;
-}
-
-void TestEyedropperAvailability::theServiceIsAsked()
-{
-    QFETCH(Answer, answer);
-    QFETCH(bool, available);
-    PrivateBus bus;
-    QVERIFY(bus.start());
-    const Answerer service(bus.connection(), answer);
-    EyedropperAvailability availability(bus.address());
-    QVERIFY(!availability.isAvailable());
-    QSignalSpy changes(&availability, &EyedropperAvailability::changed);
-    availability.ask();
-    QVERIFY(changes.wait());
-    QVERIFY(availability.isKnown());
-    QCOMPARE(availability.isAvailable(), available);
-}
-
-void TestEyedropperAvailability::withoutAServiceThereIsNone()
-{
-    PrivateBus bus;
-    QVERIFY(bus.start());
-    EyedropperAvailability availability(bus.address());
-    availability.ask();
-    QTRY_VERIFY(availability.isKnown());
-    QVERIFY(!availability.isAvailable());
-}
-
-void TestEyedropperAvailability::withoutABusThereIsNone()
-{
-    PrivateBus bus;
-    QVERIFY(bus.start());
-    bus.stop();
-    EyedropperAvailability availability(bus.address());
-    availability.ask();
-    QTRY_VERIFY(availability.isKnown());
-    QVERIFY(!availability.isAvailable());
-}
-
-void TestEyedropperAvailability::aServiceThatCannotBeStartedIsNone()
-{
-    PrivateBus bus;
-    bus.addService(serviceName, QStringLiteral("/bin/false"));
-    QVERIFY(bus.start());
-    EyedropperAvailability availability(bus.address());
-    availability.ask();
-    QTRY_VERIFY(availability.isKnown());
-    QVERIFY(!availability.isAvailable());
-}
-
-void TestEyedropperAvailability::aServiceMayComeAndGo()
-{
-    PrivateBus bus;
-    QVERIFY(bus.start());
-    EyedropperAvailability availability(bus.address());
-    availability.ask();
-    QTRY_VERIFY(availability.isKnown());
-    QVERIFY(!availability.isAvailable());
-
-    auto service = std::make_unique<Answerer>(bus.connection(), Answer::Yes);
-    QTRY_VERIFY(availability.isAvailable());
-    service.reset();
-    QTRY_VERIFY(!availability.isAvailable());
-    service = std::make_unique<Answerer>(bus.connection(), Answer::DoesNotKnow);
-    QTRY_VERIFY(availability.isAvailable());
-    bus.stop();
-    QTRY_VERIFY(!availability.isAvailable());
-}
 
 QTEST_GUILESS_MAIN(TestEyedropperAvailability)
 #include "tst_eyedropperavailability.moc"

@@ -25,48 +25,46 @@ public:
     explicit TestEyedropperDisplays(const PrivateBus &bus) : m_bus(bus) {}
 
 private Q_SLOTS:
-    void theDisplayThatShowsThePickerIsNamed();
+    void theDisplayThatShowsThePickerIsNamed()
+    {
+        qputenv("FAVRIN_DEFAULTS_FILE", (m_data.path() + QStringLiteral("/defaults.sqlite")).toUtf8());
+        QCOMPARE(QGuiApplication::screens().size(), 2);
+        ScriptedService service(m_bus.connection());
+        RoadHost host;
+        host.window.setPosition(1100, 50);
+        QTRY_COMPARE(host.window.screen()->name(), QStringLiteral("right"));
+        host.picker.present(&host.window);
+        QTRY_VERIFY(host.isReady());
+
+        int dismissals = 0;
+        connect(&host.picker, &FVColorPickerViewController::pickerDidDismissEyedropper, &host.window,
+                [&dismissals] { ++dismissals; });
+        const auto use = [&] {
+            const QPoint button = host.picker.view()->mapToScene(QPointF(host.padding() + 10, 55.0 / 2)).toPoint();
+            const auto before = service.messages.size();
+            QTest::mousePress(&host.window, Qt::LeftButton, {}, button);
+            QTRY_COMPARE(service.messages.size(), before + 1);
+            QTest::mouseRelease(&host.window, Qt::LeftButton, {}, button);
+            QTRY_COMPARE(service.messages.size(), before + 2);
+            const int heard = dismissals;
+            service.say(QStringLiteral("eyedropperDidDismiss"));
+            QTRY_COMPARE(dismissals, heard + 1);
+        };
+        use();
+        host.window.setPosition(50, 50);
+        QTRY_COMPARE(host.window.screen()->name(), QStringLiteral("left"));
+        // The host tells of it before this turn of the event loop ends.
+        QCoreApplication::processEvents();
+        use();
+        const QString floatIt = QStringLiteral("floatEyeDropper");
+        QCOMPARE(service.messages, (QStringList{QStringLiteral("beginShowingEyeDropper right"), floatIt,
+                                                QStringLiteral("beginShowingEyeDropper left"), floatIt}));
+    }
 
 private:
     const PrivateBus &m_bus;
     QTemporaryDir m_data;
 };
-
-void TestEyedropperDisplays::theDisplayThatShowsThePickerIsNamed()
-{
-    qputenv("FAVRIN_DEFAULTS_FILE", (m_data.path() + QStringLiteral("/defaults.sqlite")).toUtf8());
-    QCOMPARE(QGuiApplication::screens().size(), 2);
-    ScriptedService service(m_bus.connection());
-    RoadHost host;
-    host.window.setPosition(1100, 50);
-    QTRY_COMPARE(host.window.screen()->name(), QStringLiteral("right"));
-    host.picker.present(&host.window);
-    QTRY_VERIFY(host.isReady());
-
-    int dismissals = 0;
-    connect(&host.picker, &FVColorPickerViewController::pickerDidDismissEyedropper, &host.window,
-            [&dismissals] { ++dismissals; });
-    const auto use = [&] {
-        const QPoint button = host.picker.view()->mapToScene(QPointF(host.padding() + 10, 55.0 / 2)).toPoint();
-        const auto before = service.messages.size();
-        QTest::mousePress(&host.window, Qt::LeftButton, {}, button);
-        QTRY_COMPARE(service.messages.size(), before + 1);
-        QTest::mouseRelease(&host.window, Qt::LeftButton, {}, button);
-        QTRY_COMPARE(service.messages.size(), before + 2);
-        const int heard = dismissals;
-        service.say(QStringLiteral("eyedropperDidDismiss"));
-        QTRY_COMPARE(dismissals, heard + 1);
-    };
-    use();
-    host.window.setPosition(50, 50);
-    QTRY_COMPARE(host.window.screen()->name(), QStringLiteral("left"));
-    // The host tells of it before this turn of the event loop ends.
-    QCoreApplication::processEvents();
-    use();
-    const QString floatIt = QStringLiteral("floatEyeDropper");
-    QCOMPARE(service.messages, (QStringList{QStringLiteral("beginShowingEyeDropper right"), floatIt,
-                                            QStringLiteral("beginShowingEyeDropper left"), floatIt}));
-}
 
 int main(int argc, char *argv[])
 {
