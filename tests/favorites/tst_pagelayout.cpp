@@ -116,7 +116,8 @@ private Q_SLOTS:
         QCOMPARE(from2(120.0, 10.0), 3);
         QCOMPARE(from2(20.0, 400.0), 3);
         QCOMPARE(from2(-20.0, -400.0), 1);
-        // However quick, by one; and where it is flung back at the end, back.
+        // However far or quick, by one; and where it is flung back at the end, back.
+        QCOMPARE(from2(2 * 192.0, 10.0), 3);
         QCOMPARE(from2(192.0, 9000.0), 3);
         QCOMPARE(from2(60.0, -400.0), 1);
         // Not beyond the ends.
