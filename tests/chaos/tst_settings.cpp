@@ -172,10 +172,17 @@ private Q_SLOTS:
         QTRY_VERIFY(servicesOf(getpid()).empty());
     }
 
+    void severalPickersSaveAtOnce_data()
+    {
+        QTest::addColumn<int>("pickers");
+        QTest::newRow("two") << 2;
+        QTest::newRow("eight") << 8;
+    }
+
     void severalPickersSaveAtOnce()
     {
-        constexpr int pickers = 8;
-        std::array<ChaosHost, pickers> hosts;
+        QFETCH(int, pickers);
+        std::vector<ChaosHost> hosts(static_cast<std::size_t>(pickers));
         for (auto &host : hosts)
             host.picker.present(&host.window);
         for (const auto &host : hosts)

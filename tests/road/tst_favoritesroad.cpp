@@ -3,6 +3,7 @@
 
 #include "service/favoritesstore.h"
 
+using favrin::model::SomeColor;
 using favrin::platform::UserDefaults;
 using favrin::service::FavoritesStore;
 
@@ -104,6 +105,38 @@ private Q_SLOTS:
         host.click(favorite);
         QTRY_COMPARE(host.picks.size(), std::size_t(1));
         QCOMPARE(host.picks[0].color.toQColor(), QColor(0xff, 0xcc, 0x01));
+    }
+
+    void aSwipeTurnsThePages()
+    {
+        constexpr int favorites = 20;
+        constexpr int columns = 4;
+        constexpr int perPage = 2 * columns;
+        FavoritesStore::ColorList colors;
+        for (int i = 0; i < favorites; ++i)
+            colors.emplace_back(10 * i / 255.0, 10 * i / 255.0, 10 * i / 255.0, 1.0, SomeColor::ColorSpace::sRGB);
+        UserDefaults defaults(defaultsFile().toStdString());
+        FavoritesStore(defaults).saveFavoriteColors(colors, true);
+
+        FavoritesHost host;
+        QVERIFY(host.present(FVColor(1, 1, 1)));
+        for (const int page : {1, 2, 1, 0}) {
+            const bool isForward = qGray(host.pixel(host.favorite(0, 0))) < 10 * perPage * page;
+            const int to = isForward ? 0 : columns - 1;
+            QPoint finger = host.favorite(0, columns - 1 - to);
+            // Until the next page's foremost swatch has come three quarters of the way.
+            const QPoint seen = host.favorite(0, isForward ? 1 : 2);
+            Pointer pointer(host.window, touchScreen());
+            pointer.press(finger);
+            QVERIFY(QTest::qWaitFor([&] {
+                pointer.move(finger += QPoint(isForward ? -8 : 8, 0));
+                return qGray(host.pixel(seen)) == 10 * (perPage * page + to);
+            }));
+            pointer.release(finger);
+            QTRY_COMPARE(qGray(host.pixel(host.favorite(0, 0))), 10 * perPage * page);
+            host.click(host.favorite(0, 0));
+            QTRY_VERIFY(!host.picks.empty() && host.picks.back().color == gray(10 * perPage * page));
+        }
     }
 
 private:

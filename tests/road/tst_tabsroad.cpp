@@ -1,9 +1,6 @@
 #include "onepointer.h"
 #include "roadtest.h"
 
-#include <QClipboard>
-#include <QGuiApplication>
-
 namespace {
 
 constexpr int spectrumTab = 1;
@@ -114,45 +111,6 @@ private Q_SLOTS:
         QVERIFY2(isAbout(field, picked), qPrintable(QColor(field).name() + QLatin1Char(' ') + picked.name()));
         send(QEvent::MouseButtonRelease, elsewhere);
         QTRY_VERIFY(host.hasFinalPick());
-    }
-
-    void fieldsTakeEveryKeyAndWhatIsPasted()
-    {
-        const FVColor odd(0.1 + 0.2, 1.0 / 3.0, 5e-324, 0.123456789012345678);
-        RoadHost host(QSize(420, 900));
-        host.window.requestActivate();
-        QVERIFY(host.present(odd));
-        host.click(host.tabSegment(slidersTab));
-        const auto tab = [&host](int times) {
-            for (int time = 0; time < times; ++time)
-                QTest::keyClick(&host.window, Qt::Key_Tab);
-        };
-        auto *clipboard = QGuiApplication::clipboard();
-        const auto copied = [&] {
-            clipboard->clear();
-            QTest::keyClick(&host.window, Qt::Key_A, Qt::ControlModifier);
-            QTest::keyClick(&host.window, Qt::Key_C, Qt::ControlModifier);
-            return QTest::qWaitFor([clipboard] { return !clipboard->text().isEmpty(); }) ? clipboard->text()
-                                                                                         : QString();
-        };
-        // Eyedropper, close button, tab picker, and a track and a field for each component. That of blue takes digits
-        // only, and three of them.
-        tab(9);
-        for (const char key : {'x', '2', '5', '-', '4', '7'})
-            QTest::keyClick(&host.window, key);
-        QCOMPARE(copied(), QStringLiteral("254"));
-        QCOMPARE(host.picks.size(), std::size_t(3));
-        for (std::size_t i = 0; i < 3; ++i) {
-            const FVColor typed(odd.red(), odd.green(), std::array{2, 25, 254}[i] / 255.0, odd.alpha());
-            QCOMPARE(host.picks[i], (RoadHost::Pick{typed, FVColor::sRGBName(), false}));
-        }
-        // The button of the color space, and the field of its hexadecimal digits.
-        tab(2);
-        QCOMPARE(copied(), QStringLiteral("4D55FE"));
-        clipboard->setText(QStringLiteral("rgb(0 97 253)"));
-        QTest::keyClick(&host.window, Qt::Key_V, Qt::ControlModifier);
-        QTRY_COMPARE(host.picks.size(), std::size_t(4));
-        QCOMPARE(host.picks.back().color, FVColor(0, 97 / 255.0, 253 / 255.0));
     }
 
     void theTabThatWasLeftIsShownAgain()

@@ -138,6 +138,12 @@ private Q_SLOTS:
         QTest::addColumn<bool>("allSelected");
         QTest::addColumn<QString>("pasted");
         QTest::addColumn<QString>("shown");
+        QTest::newRow("plain") << true << "ff8000"
+                               << "FF8000";
+        QTest::newRow("with a sign") << true << "#FF8000"
+                                     << "FF8000";
+        QTest::newRow("CSS") << false << "rgb(255, 128, 0)"
+                             << "FF8000";
         QTest::newRow("resembling what is there") << true << "#0061FE"
                                                   << "0061FE";
         QTest::newRow("at the caret") << false << "#FF8000"
